@@ -28,7 +28,8 @@ PropList MakeWorkspaceLike(std::size_t targetBytes) {
     tabState.OutputAsXMLFragment(stateText);
 
     int window = 0;
-    while (utils::DocumentText(doc).size() < targetBytes) {
+    std::size_t windowBytes = 0;
+    while (windowBytes == 0 || std::size_t(window) * windowBytes < targetBytes) {
         PropList* tlw = doc.NewSubList("TopLevelFrame-" + std::to_string(window++));
         tlw->SetValue("SzPos", std::vector<std::int32_t>{0, 0, 1920, 1080});
         tlw->SetValue("HasToolBar", true);
@@ -46,6 +47,11 @@ PropList MakeWorkspaceLike(std::size_t targetBytes) {
                 frame->SetValue("VisTabState-" + std::to_string(tab), stateText);
             }
             splitter = splitter->NewSubList("Sub2")->NewSubList("Splitter");
+        }
+        if (windowBytes == 0) {
+            std::string text;
+            tlw->OutputAsXMLFragment(text);
+            windowBytes = text.size();
         }
     }
     doc.SetValue("SerCfgMax", window);

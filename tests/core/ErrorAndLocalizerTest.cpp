@@ -61,7 +61,8 @@ TEST_F(LocalizerTest, TableHoldsEveryErrorOnceWithItsDefaultText) {
     EXPECT_EQ(codes.size(), 16u);
     EXPECT_EQ(FindErrorEntry(107, 0)->key,
               std::string("$$$/orvcore/geom/matrix/Error/NonInvertableMatrix=Matrix cannot be inverted."));
-    EXPECT_EQ(Localizer::Get().Localize(FindErrorEntry(102, 24)->key), u"Workspaces Manager already initialized");
+    EXPECT_EQ(Localizer::Get().Localize(FindErrorEntry(102, 24)->key),
+              u"Workspaces Manager already initialized");
 }
 
 TEST_F(LocalizerTest, TranslationReplacesDefaultTextAndFillsPlaceholders) {
@@ -85,8 +86,8 @@ TEST_F(LocalizerTest, LocalizeKeepsPlainTextAndSplitsAtFirstEquals) {
 }
 
 TEST(ReplaceInString, FillsEveryPlaceholderInOnePass) {
-    EXPECT_EQ(ReplaceInString(u"@0-@1-@2-@3-@4-@5-@6-@7-@8-@9", u"a", u"b", u"c", u"d", u"e", u"f", u"g", u"h", u"i",
-                              u"j"),
+    EXPECT_EQ(ReplaceInString(u"@0-@1-@2-@3-@4-@5-@6-@7-@8-@9", u"a", u"b", u"c", u"d", u"e", u"f", u"g",
+                              u"h", u"i", u"j"),
               u"a-b-c-d-e-f-g-h-i-j");
     // A replacement that holds a placeholder is not filled again.
     EXPECT_EQ(ReplaceInString(u"@0 and @1", u"@1", u"x"), u"@1 and x");

@@ -26,7 +26,8 @@ namespace {
 // Sets or clears an environment variable for one test, restoring it afterwards.
 class ScopedEnv {
 public:
-    ScopedEnv(char const* name, char const* value) : name_(name) {
+    ScopedEnv(char const* name, char const* value)
+        : name_(name) {
         if (char const* old = std::getenv(name)) {
             old_ = old;
             hadOld_ = true;

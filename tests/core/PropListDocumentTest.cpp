@@ -29,7 +29,8 @@ PropList RoundTrip(PropList const& list) {
 // Every value kind, extremes included, nested two levels.
 PropList EveryKind() {
     PropList list;
-    list.SetValue("utf8", "Gr\xC3\xBC\xC3\x9F" "e \xF0\x9F\x8E\xAC");
+    list.SetValue("utf8", "Gr\xC3\xBC\xC3\x9F"
+                          "e \xF0\x9F\x8E\xAC");
     list.SetValue("utf16", u"\u65E5\u672C");
     list.SetValue("empty", "");
     list.SetByteString("bytes", std::string("\x01\x7F\xFE\xFF", 4));
@@ -73,18 +74,19 @@ TEST(PropListDocument, ExactBytesOfASmallDocument) {
     list.SetValue("d", 19.0);
     list.SetValue("u", std::uint32_t(3));
     list.NewSubList("n");
-    std::string expected = "<?xml version='1.0'?>\r\n"
-                           "<prop.map version='4'>\r\n"
-                           "<prop.list>\r\n"
-                           "<prop.pair>\r\n<key>B</key>\r\n<ustring>x&lt;&amp;&gt;'\"</ustring>\r\n</prop.pair>\r\n"
-                           "<prop.pair>\r\n<key>a</key>\r\n<true/>\r\n</prop.pair>\r\n"
-                           "<prop.pair>\r\n<key>b</key>\r\n<int type='signed' size='32'>1</int>\r\n</prop.pair>\r\n"
-                           "<prop.pair>\r\n<key>d</key>\r\n<double>19</double>\r\n</prop.pair>\r\n"
-                           "<prop.pair>\r\n<key>f</key>\r\n<float>4.5</float>\r\n</prop.pair>\r\n"
-                           "<prop.pair>\r\n<key>n</key>\r\n<prop.list>\r\n</prop.list>\r\n</prop.pair>\r\n"
-                           "<prop.pair>\r\n<key>u</key>\r\n<int type='unsigned' size='32'>3</int>\r\n</prop.pair>\r\n"
-                           "</prop.list>\r\n"
-                           "</prop.map>\r\n";
+    std::string expected =
+        "<?xml version='1.0'?>\r\n"
+        "<prop.map version='4'>\r\n"
+        "<prop.list>\r\n"
+        "<prop.pair>\r\n<key>B</key>\r\n<ustring>x&lt;&amp;&gt;'\"</ustring>\r\n</prop.pair>\r\n"
+        "<prop.pair>\r\n<key>a</key>\r\n<true/>\r\n</prop.pair>\r\n"
+        "<prop.pair>\r\n<key>b</key>\r\n<int type='signed' size='32'>1</int>\r\n</prop.pair>\r\n"
+        "<prop.pair>\r\n<key>d</key>\r\n<double>19</double>\r\n</prop.pair>\r\n"
+        "<prop.pair>\r\n<key>f</key>\r\n<float>4.5</float>\r\n</prop.pair>\r\n"
+        "<prop.pair>\r\n<key>n</key>\r\n<prop.list>\r\n</prop.list>\r\n</prop.pair>\r\n"
+        "<prop.pair>\r\n<key>u</key>\r\n<int type='unsigned' size='32'>3</int>\r\n</prop.pair>\r\n"
+        "</prop.list>\r\n"
+        "</prop.map>\r\n";
     EXPECT_EQ(DocumentText(list), expected);
 
     TempDir tmp;
@@ -99,14 +101,15 @@ TEST(PropListDocument, ListKindsHaveTheirOwnElements) {
     list.SetValue("w", std::vector<std::u16string>{});
     std::string xml;
     list.OutputAsXMLFragment(xml);
-    EXPECT_EQ(xml, "<prop.list>\r\n"
-                   "<prop.pair>\r\n<key>i</key>\r\n<array type='int32'>\r\n"
-                   "<int type='signed' size='32'>1</int>\r\n<int type='signed' size='32'>-2</int>\r\n"
-                   "</array>\r\n</prop.pair>\r\n"
-                   "<prop.pair>\r\n<key>s</key>\r\n<array type='utf8'>\r\n<ustring>x</ustring>\r\n</array>\r\n"
-                   "</prop.pair>\r\n"
-                   "<prop.pair>\r\n<key>w</key>\r\n<array type='utf16'>\r\n</array>\r\n</prop.pair>\r\n"
-                   "</prop.list>\r\n");
+    EXPECT_EQ(xml,
+              "<prop.list>\r\n"
+              "<prop.pair>\r\n<key>i</key>\r\n<array type='int32'>\r\n"
+              "<int type='signed' size='32'>1</int>\r\n<int type='signed' size='32'>-2</int>\r\n"
+              "</array>\r\n</prop.pair>\r\n"
+              "<prop.pair>\r\n<key>s</key>\r\n<array type='utf8'>\r\n<ustring>x</ustring>\r\n</array>\r\n"
+              "</prop.pair>\r\n"
+              "<prop.pair>\r\n<key>w</key>\r\n<array type='utf16'>\r\n</array>\r\n</prop.pair>\r\n"
+              "</prop.list>\r\n");
 }
 
 TEST(PropListDocument, RealNumbersUseSixSignificantDigits) {
@@ -121,8 +124,8 @@ TEST(PropListDocument, RealNumbersUseSixSignificantDigits) {
     std::string xml;
     list.OutputAsXMLFragment(xml);
     for (char const* text : {"<double>4.5</double>", "<float>19</float>", "<double>1.79769e+308</double>",
-                             "<double>0.333333</double>", "<double>1.23457e+06</double>", "<float>0.1</float>",
-                             "<double>-0</double>"}) {
+                             "<double>0.333333</double>", "<double>1.23457e+06</double>",
+                             "<float>0.1</float>", "<double>-0</double>"}) {
         EXPECT_NE(xml.find(text), std::string::npos) << text << " not in\n" << xml;
     }
     PropList back = RoundTrip(list);
@@ -233,8 +236,8 @@ TEST(PropListDocument, ReadPropListAcceptsAWholeDocument) {
 
 TEST(PropListDocument, HandWrittenDocumentsReadAsExpected) {
     PropList list;
-    ASSERT_TRUE(LoadPropList(TempDir::PathU16(fs::path(ORV_TEST_DATA_DIR) / "proplist" / "handwritten.xml"), list,
-                             true));
+    ASSERT_TRUE(LoadPropList(TempDir::PathU16(fs::path(ORV_TEST_DATA_DIR) / "proplist" / "handwritten.xml"),
+                             list, true));
     std::string name;
     EXPECT_TRUE(list.GetValue("Name", name));
     EXPECT_EQ(name, "Edit <1> & \"Colour\"");

@@ -15,12 +15,14 @@ TEST(TextConversion, RoundTripsEveryPlane) {
 }
 
 TEST(TextConversion, InvalidUTF8BecomesReplacementCharactersAndKeepsTheRest) {
-    EXPECT_EQ(UTF8to16("a\xFF" "b"), u"a\uFFFDb");
-    EXPECT_EQ(UTF8to16("\xC0\xAF"), u"\uFFFD\uFFFD");              // overlong slash
-    EXPECT_EQ(UTF8to16("\xED\xA0\x80x"), u"\uFFFD\uFFFD\uFFFDx");   // encoded surrogate
+    EXPECT_EQ(UTF8to16("a\xFF"
+                       "b"),
+              u"a\uFFFDb");
+    EXPECT_EQ(UTF8to16("\xC0\xAF"), u"\uFFFD\uFFFD");                     // overlong slash
+    EXPECT_EQ(UTF8to16("\xED\xA0\x80x"), u"\uFFFD\uFFFD\uFFFDx");         // encoded surrogate
     EXPECT_EQ(UTF8to16("\xF4\x90\x80\x80"), u"\uFFFD\uFFFD\uFFFD\uFFFD"); // beyond U+10FFFF
-    EXPECT_EQ(UTF8to16("ok\xE2\x82"), u"ok\uFFFD\uFFFD");          // truncated at the end
-    EXPECT_EQ(UTF8to16("\xE2\x82z"), u"\uFFFD\uFFFDz");             // continuation missing
+    EXPECT_EQ(UTF8to16("ok\xE2\x82"), u"ok\uFFFD\uFFFD");                 // truncated at the end
+    EXPECT_EQ(UTF8to16("\xE2\x82z"), u"\uFFFD\uFFFDz");                   // continuation missing
     EXPECT_EQ(UTF8to16(std::string("a\0b", 3)), std::u16string(u"a\0b", 3));
 }
 

@@ -10,9 +10,13 @@ namespace orvcore::filesupport {
 
 namespace fs = std::filesystem;
 
-fs::path ToPath(std::u16string const& path) { return fs::path(utility::UTF16to8(path)); }
+fs::path ToPath(std::u16string const& path) {
+    return fs::path(utility::UTF16to8(path));
+}
 
-std::u16string FromPath(fs::path const& path) { return utility::UTF8to16(path.string()); }
+std::u16string FromPath(fs::path const& path) {
+    return utility::UTF8to16(path.string());
+}
 
 namespace {
 std::string Environment(char const* name) {
@@ -36,9 +40,11 @@ Dir Dir::PrefDir() {
     return dir;
 }
 
-Dir::Dir(std::u16string const& path) : path_(ToPath(path)) {}
+Dir::Dir(std::u16string const& path)
+    : path_(ToPath(path)) {}
 
-Dir::Dir(Dir const& parent, std::u16string const& name) : path_(parent.path_ / ToPath(name)) {}
+Dir::Dir(Dir const& parent, std::u16string const& name)
+    : path_(parent.path_ / ToPath(name)) {}
 
 bool Dir::Exists() const {
     std::error_code ec;
@@ -51,6 +57,8 @@ bool Dir::Create() const {
     return Exists();
 }
 
-std::u16string Dir::FullPath() const { return FromPath(path_); }
+std::u16string Dir::FullPath() const {
+    return FromPath(path_);
+}
 
 } // namespace orvcore::filesupport

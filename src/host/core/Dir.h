@@ -14,7 +14,8 @@ public:
     static Dir PrefDir();
 
     explicit Dir(std::u16string const& path);
-    explicit Dir(std::filesystem::path path) : path_(std::move(path)) {}
+    explicit Dir(std::filesystem::path path)
+        : path_(std::move(path)) {}
     // The folder `name` inside `parent`.
     Dir(Dir const& parent, std::u16string const& name);
 

@@ -10,11 +10,14 @@
 
 namespace orvcore::config {
 
-ReplacementValue::ReplacementValue(std::string const& utf8) : text_(utility::UTF8to16(utf8)) {}
+ReplacementValue::ReplacementValue(std::string const& utf8)
+    : text_(utility::UTF8to16(utf8)) {}
 
-ReplacementValue::ReplacementValue(char const* utf8) : text_(utility::UTF8to16(utf8 ? utf8 : "")) {}
+ReplacementValue::ReplacementValue(char const* utf8)
+    : text_(utility::UTF8to16(utf8 ? utf8 : "")) {}
 
-ReplacementValue::ReplacementValue(long long number) : text_(utility::AsciiToUTF16(std::to_string(number))) {}
+ReplacementValue::ReplacementValue(long long number)
+    : text_(utility::AsciiToUTF16(std::to_string(number))) {}
 
 Error::Error(int level, std::string key, int facility, int code, bool report, std::u16string message)
     : level_(level)
@@ -25,12 +28,15 @@ Error::Error(int level, std::string key, int facility, int code, bool report, st
     , message_(std::move(message))
     , what_(utility::UTF16to8(message_)) {}
 
-ErrorEntry const* Error::Entry() const { return FindErrorEntry(facility_, code_); }
+ErrorEntry const* Error::Entry() const {
+    return FindErrorEntry(facility_, code_);
+}
 
-void ThrowError(int level, std::string const& key, int facility, int code, bool report, ReplacementValue const& r1,
-                ReplacementValue const& r2, ReplacementValue const& r3, ReplacementValue const& r4) {
-    std::u16string message = utility::ReplaceInString(Localizer::Get().Localize(key), r1.Text(), r2.Text(),
-                                                      r3.Text(), r4.Text());
+void ThrowError(int level, std::string const& key, int facility, int code, bool report,
+                ReplacementValue const& r1, ReplacementValue const& r2, ReplacementValue const& r3,
+                ReplacementValue const& r4) {
+    std::u16string message =
+        utility::ReplaceInString(Localizer::Get().Localize(key), r1.Text(), r2.Text(), r3.Text(), r4.Text());
     throw Error(level, key, facility, code, report, std::move(message));
 }
 
@@ -62,8 +68,12 @@ constexpr ErrorEntry Table[] = {
 
 } // namespace
 
-ErrorEntry const* ErrorTableBegin() { return std::begin(Table); }
-ErrorEntry const* ErrorTableEnd() { return std::end(Table); }
+ErrorEntry const* ErrorTableBegin() {
+    return std::begin(Table);
+}
+ErrorEntry const* ErrorTableEnd() {
+    return std::end(Table);
+}
 
 ErrorEntry const* FindErrorEntry(int facility, int code) {
     for (ErrorEntry const& e : Table) {

@@ -14,7 +14,8 @@ struct ErrorEntry;
 class ReplacementValue {
 public:
     ReplacementValue() = default;
-    ReplacementValue(std::u16string text) : text_(std::move(text)) {}
+    ReplacementValue(std::u16string text)
+        : text_(std::move(text)) {}
     ReplacementValue(std::string const& utf8);
     ReplacementValue(char const* utf8);
     ReplacementValue(long long number);

@@ -18,7 +18,8 @@ namespace errors {
 inline constexpr ErrorEntry CannotCreateOverlayWindow{
     102, 20, "$$$/orvworkspace/Error/CannotCreateOverlayWindow=Unable to create overlay window."};
 inline constexpr ErrorEntry CannotCreateEmptyOverlayWindow{
-    102, 21, "$$$/orvworkspace/Error/CannotCreateEmptyOverlayWindow=Attempted to create empty overlay window."};
+    102, 21,
+    "$$$/orvworkspace/Error/CannotCreateEmptyOverlayWindow=Attempted to create empty overlay window."};
 inline constexpr ErrorEntry InvalidWorkspace{
     102, 22, "$$$/orvworkspace/workspace/Error/InvalidWorkspace=Not a valid workspace definition."};
 inline constexpr ErrorEntry UnableToLoadWorkspace{
@@ -27,19 +28,24 @@ inline constexpr ErrorEntry UnableToLoadWorkspace{
     "definition version."};
 inline constexpr ErrorEntry WorkspaceManagerAlreadyInitialized{
     102, 24,
-    "$$$/orvworkspace/workspace/Error/WorkspaceManager/AlreadyIntialized=Workspaces Manager already initialized"};
+    "$$$/orvworkspace/workspace/Error/WorkspaceManager/AlreadyIntialized=Workspaces Manager already "
+    "initialized"};
 inline constexpr ErrorEntry WorkspaceManagerNotInitialized{
-    102, 25, "$$$/orvworkspace/workspace/Error/WorkspaceManager/NotInitialized=Workspaces Manager not initialized"};
+    102, 25,
+    "$$$/orvworkspace/workspace/Error/WorkspaceManager/NotInitialized=Workspaces Manager not initialized"};
 inline constexpr ErrorEntry WorkspaceAlreadyExists{
     102, 26,
-    "$$$/orvworkspace/workspace/Error/WorkspaceManager/WorkspaceAlreadyExists=A workspace with this name already "
+    "$$$/orvworkspace/workspace/Error/WorkspaceManager/WorkspaceAlreadyExists=A workspace with this name "
+    "already "
     "exists."};
 inline constexpr ErrorEntry CannotCreateWorkspace{
-    102, 27, "$$$/orvworkspace/workspace/Error/WorkspaceManager/CannotCreateWorkspace=Could not create workspace."};
+    102, 27,
+    "$$$/orvworkspace/workspace/Error/WorkspaceManager/CannotCreateWorkspace=Could not create workspace."};
 inline constexpr ErrorEntry UnknownWorkspace{
     102, 28, "$$$/orvworkspace/workspace/Error/WorkspaceManager/UnknownWorkspace=Unknown workspace."};
 inline constexpr ErrorEntry UnableToAccessResource{
-    105, 20, "$$$/orvworkspace/utility/Error/ResourceUtils/UnableToAccessResource=Unable to access resource."};
+    105, 20,
+    "$$$/orvworkspace/utility/Error/ResourceUtils/UnableToAccessResource=Unable to access resource."};
 inline constexpr ErrorEntry InvalidTypeConversion{
     105, 21, "$$$/orvcore/utility/Error/InvalidTypeConversion=Invalid type conversion."};
 inline constexpr ErrorEntry NonInvertibleMatrix{

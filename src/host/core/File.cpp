@@ -9,15 +9,23 @@ namespace orvcore::filesupport {
 
 namespace fs = std::filesystem;
 
-File::File(Dir const& dir, std::u16string const& name) : path_(dir.Path() / ToPath(name)) {}
+File::File(Dir const& dir, std::u16string const& name)
+    : path_(dir.Path() / ToPath(name)) {}
 
-File::File(std::u16string const& path) : path_(ToPath(path)) {}
+File::File(std::u16string const& path)
+    : path_(ToPath(path)) {}
 
-std::u16string File::FullPath() const { return FromPath(path_); }
+std::u16string File::FullPath() const {
+    return FromPath(path_);
+}
 
-std::u16string File::GetName() const { return FromPath(path_.filename()); }
+std::u16string File::GetName() const {
+    return FromPath(path_.filename());
+}
 
-std::u16string File::GetExtension() const { return FromPath(path_.extension()); }
+std::u16string File::GetExtension() const {
+    return FromPath(path_.extension());
+}
 
 bool File::Exists() const {
     std::error_code ec;

@@ -34,8 +34,9 @@ bool FileUtils::ContainedFiles(std::u16string const& folder, std::vector<std::u1
     if (ec) {
         return false;
     }
-    std::sort(found.begin(), found.end(),
-              [](fs::path const& a, fs::path const& b) { return a.filename().string() < b.filename().string(); });
+    std::sort(found.begin(), found.end(), [](fs::path const& a, fs::path const& b) {
+        return a.filename().string() < b.filename().string();
+    });
     for (fs::path const& p : found) {
         list.push_back(FromPath(p));
     }
@@ -78,7 +79,8 @@ namespace {
 class TempFile {
 public:
     explicit TempFile(fs::path const& target) {
-        std::string pattern = (target.parent_path() / ("." + target.filename().string() + ".tmp-XXXXXX")).string();
+        std::string pattern =
+            (target.parent_path() / ("." + target.filename().string() + ".tmp-XXXXXX")).string();
         name_.assign(pattern.begin(), pattern.end());
         name_.push_back('\0');
         fd_ = ::mkstemp(name_.data());
@@ -148,7 +150,9 @@ private:
     bool committed_ = false;
 };
 
-std::string Reason(int error) { return std::strerror(error); }
+std::string Reason(int error) {
+    return std::strerror(error);
+}
 
 } // namespace
 

@@ -11,7 +11,8 @@ template <typename T> class Flags {
 
 public:
     constexpr Flags() = default;
-    constexpr explicit Flags(T value) : value_(value) {}
+    constexpr explicit Flags(T value)
+        : value_(value) {}
 
     constexpr bool IsSet(unsigned bit) const { return bit < Width && (value_ & Mask(bit)) != 0; }
     constexpr void Set(unsigned bit, bool on = true) {

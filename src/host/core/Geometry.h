@@ -13,7 +13,9 @@ template <typename T> struct PointT {
     T y{};
 
     constexpr PointT() = default;
-    constexpr PointT(T px, T py) : x(px), y(py) {}
+    constexpr PointT(T px, T py)
+        : x(px)
+        , y(py) {}
 
     constexpr PointT operator+(PointT const& o) const { return {T(x + o.x), T(y + o.y)}; }
     constexpr PointT operator-(PointT const& o) const { return {T(x - o.x), T(y - o.y)}; }
@@ -30,7 +32,11 @@ template <typename T> struct RectT {
     T height{};
 
     constexpr RectT() = default;
-    constexpr RectT(T l, T t, T w, T h) : left(l), top(t), width(w), height(h) {}
+    constexpr RectT(T l, T t, T w, T h)
+        : left(l)
+        , top(t)
+        , width(w)
+        , height(h) {}
 
     // Builds a rectangle from its edges; the edges may come in any order.
     static constexpr RectT FromEdges(T l, T t, T r, T b) {

@@ -9,7 +9,9 @@ namespace {
 constexpr char Prefix[] = "$$$/";
 constexpr std::size_t PrefixLength = sizeof(Prefix) - 1;
 
-bool IsLocalizationString(std::string const& text) { return text.compare(0, PrefixLength, Prefix) == 0; }
+bool IsLocalizationString(std::string const& text) {
+    return text.compare(0, PrefixLength, Prefix) == 0;
+}
 } // namespace
 
 Localizer& Localizer::Get() {

@@ -118,7 +118,9 @@ bool PropList::GetValue(std::string const& key, std::u16string& out) const {
     return true;
 }
 
-bool PropList::GetByteString(std::string const& key, std::string& out) const { return GetValue(key, out); }
+bool PropList::GetByteString(std::string const& key, std::string& out) const {
+    return GetValue(key, out);
+}
 
 bool PropList::GetValue(std::string const& key, bool& out) const {
     Value const* v = Find(key);
@@ -234,17 +236,39 @@ bool PropList::GetValue(std::string const& key, std::vector<std::u16string>& out
     return false;
 }
 
-void PropList::SetValue(std::string const& key, std::string const& value) { Slot(key) = value; }
-void PropList::SetValue(std::string const& key, std::u16string const& value) { Slot(key) = utility::UTF16to8(value); }
-void PropList::SetValue(std::string const& key, bool value) { Slot(key) = value; }
-void PropList::SetValue(std::string const& key, std::int32_t value) { Slot(key) = value; }
-void PropList::SetValue(std::string const& key, std::uint32_t value) { Slot(key) = value; }
-void PropList::SetValue(std::string const& key, float value) { Slot(key) = value; }
-void PropList::SetValue(std::string const& key, double value) { Slot(key) = value; }
-void PropList::SetValue(std::string const& key, std::vector<std::int32_t> const& value) { Slot(key) = value; }
-void PropList::SetValue(std::string const& key, std::vector<std::string> const& value) { Slot(key) = value; }
-void PropList::SetValue(std::string const& key, std::vector<std::u16string> const& value) { Slot(key) = value; }
-void PropList::SetByteString(std::string const& key, std::string const& bytes) { Slot(key) = Bytes{bytes}; }
+void PropList::SetValue(std::string const& key, std::string const& value) {
+    Slot(key) = value;
+}
+void PropList::SetValue(std::string const& key, std::u16string const& value) {
+    Slot(key) = utility::UTF16to8(value);
+}
+void PropList::SetValue(std::string const& key, bool value) {
+    Slot(key) = value;
+}
+void PropList::SetValue(std::string const& key, std::int32_t value) {
+    Slot(key) = value;
+}
+void PropList::SetValue(std::string const& key, std::uint32_t value) {
+    Slot(key) = value;
+}
+void PropList::SetValue(std::string const& key, float value) {
+    Slot(key) = value;
+}
+void PropList::SetValue(std::string const& key, double value) {
+    Slot(key) = value;
+}
+void PropList::SetValue(std::string const& key, std::vector<std::int32_t> const& value) {
+    Slot(key) = value;
+}
+void PropList::SetValue(std::string const& key, std::vector<std::string> const& value) {
+    Slot(key) = value;
+}
+void PropList::SetValue(std::string const& key, std::vector<std::u16string> const& value) {
+    Slot(key) = value;
+}
+void PropList::SetByteString(std::string const& key, std::string const& bytes) {
+    Slot(key) = Bytes{bytes};
+}
 
 PropList* PropList::GetSubList(std::string const& key) {
     return const_cast<PropList*>(static_cast<PropList const*>(this)->GetSubList(key));

@@ -24,8 +24,8 @@ public:
     // The kinds of value a pair can hold, one per XML value element.
     enum class Kind {
         SubList,
-        String,      // UTF-8 text; UTF-16 texts are stored as this kind too
-        ByteString,  // bytes that need not be UTF-8
+        String,     // UTF-8 text; UTF-16 texts are stored as this kind too
+        ByteString, // bytes that need not be UTF-8
         Int32,
         UInt32,
         Float,
@@ -111,8 +111,8 @@ private:
         bool operator==(Bytes const& o) const { return bytes == o.bytes; }
     };
     // The alternatives are in the order of Kind.
-    using Value = std::variant<std::unique_ptr<PropList>, std::string, Bytes, std::int32_t, std::uint32_t, float,
-                               double, bool, std::vector<std::u16string>, std::vector<std::string>,
+    using Value = std::variant<std::unique_ptr<PropList>, std::string, Bytes, std::int32_t, std::uint32_t,
+                               float, double, bool, std::vector<std::u16string>, std::vector<std::string>,
                                std::vector<std::int32_t>>;
     struct Entry {
         std::string key;

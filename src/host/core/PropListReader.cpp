@@ -19,15 +19,22 @@ namespace detail {
 // order without a search per pair.
 class PropListBuilder {
 public:
-    explicit PropListBuilder(std::u16string const& sourceName) : sourceName_(sourceName) {}
+    explicit PropListBuilder(std::u16string const& sourceName)
+        : sourceName_(sourceName) {}
 
     void ReadList(pugi::xml_node node, PropList& list, int depth) {
-        for (pugi::xml_node child : node.children()) {
-            if (SkipWhitespace(child, "a list")) {
+        std::size_t children = 0;
+        for (pugi::xml_node child = node.first_child(); child; child = child.next_sibling()) {
+            ++children;
+        }
+        list.entries_.reserve(children);
+        for (pugi::xml_node child = node.first_child(); child; child = child.next_sibling()) {
+            if (SkipLayoutText(child, "a list")) {
                 continue;
             }
             if (std::strcmp(child.name(), "prop.pair") != 0) {
-                Fail(child, "the element <" + std::string(child.name()) + "> stands where a <prop.pair> belongs");
+                Fail(child,
+                     "the element <" + std::string(child.name()) + "> stands where a <prop.pair> belongs");
             }
             ReadPair(child, list, depth);
         }
@@ -39,12 +46,13 @@ public:
     }
 
 private:
-    // True for text between elements that is only layout; other text there is an error.
-    bool SkipWhitespace(pugi::xml_node node, char const* context) const {
-        if (node.type() == pugi::node_element) {
+    // True for anything but an element: text between elements, which may only be layout.
+    bool SkipLayoutText(pugi::xml_node node, char const* context) const {
+        pugi::xml_node_type type = node.type();
+        if (type == pugi::node_element) {
             return false;
         }
-        if (node.type() == pugi::node_pcdata || node.type() == pugi::node_cdata) {
+        if (type == pugi::node_pcdata || type == pugi::node_cdata) {
             for (char const* c = node.value(); *c; ++c) {
                 if (*c != ' ' && *c != '\t' && *c != '\r' && *c != '\n') {
                     Fail(node, std::string("unexpected text in ") + context);
@@ -56,8 +64,8 @@ private:
 
     void ReadPair(pugi::xml_node pair, PropList& list, int depth) {
         pugi::xml_node keyNode, valueNode;
-        for (pugi::xml_node child : pair.children()) {
-            if (SkipWhitespace(child, "a pair")) {
+        for (pugi::xml_node child = pair.first_child(); child; child = child.next_sibling()) {
+            if (SkipLayoutText(child, "a pair")) {
                 continue;
             }
             if (!keyNode) {
@@ -75,71 +83,101 @@ private:
             Fail(pair, keyNode ? "a pair has no value" : "a pair has no key");
         }
         std::string key = Text(keyNode);
-        PropList::Value& slot = NewSlot(list, key, pair);
-        ReadValue(valueNode, key, slot, depth);
-    }
-
-    // The slot of a key not yet in the list; a repeated key is an error, since a list holds each key
-    // once and silently keeping either value could lose the other.
-    PropList::Value& NewSlot(PropList& list, std::string const& key, pugi::xml_node at) {
+        // A list holds each key once; keeping either of two values silently could lose the other.
         auto& entries = list.entries_;
-        if (entries.empty() || entries.back().key < key) {
-            entries.push_back(PropList::Entry{key, PropList::Value()});
-            return entries.back().value;
+        bool append = entries.empty() || entries.back().key < key;
+        if (!append && list.HasKey(key)) {
+            Fail(pair, "the key '" + key + "' occurs twice in one list");
         }
-        if (list.HasKey(key)) {
-            Fail(at, "the key '" + key + "' occurs twice in one list");
-        }
-        return list.Slot(key);
-    }
-
-    void ReadValue(pugi::xml_node node, std::string const& key, PropList::Value& slot, int depth) {
-        char const* name = node.name();
-        if (std::strcmp(name, "prop.list") == 0) {
-            if (depth + 1 > utils::MaxNestingDepth) {
-                Fail(node, "lists are nested deeper than " + std::to_string(utils::MaxNestingDepth));
-            }
-            auto sub = std::make_unique<PropList>();
-            ReadList(node, *sub, depth + 1);
-            slot = std::move(sub);
-        } else if (std::strcmp(name, "ustring") == 0) {
-            slot = Text(node);
-        } else if (std::strcmp(name, "string") == 0) {
-            slot = PropList::Bytes{Text(node)};
-        } else if (std::strcmp(name, "int") == 0) {
-            ReadInt(node, key, slot);
-        } else if (std::strcmp(name, "float") == 0) {
-            slot = Number<float>(node, key, "float");
-        } else if (std::strcmp(name, "double") == 0) {
-            slot = Number<double>(node, key, "double");
-        } else if (std::strcmp(name, "true") == 0 || std::strcmp(name, "false") == 0) {
-            if (!Text(node).empty()) {
-                Fail(node, "the boolean of key '" + key + "' has content");
-            }
-            slot = name[0] == 't';
-        } else if (std::strcmp(name, "array") == 0) {
-            ReadArray(node, key, slot);
+        PropList::Value value = ReadValue(valueNode, key, depth);
+        if (append) {
+            entries.push_back(PropList::Entry{std::move(key), std::move(value)});
         } else {
-            Fail(node, "the key '" + key + "' has a value of unknown kind <" + std::string(name) + ">");
+            list.Slot(key) = std::move(value);
         }
     }
 
-    void ReadInt(pugi::xml_node node, std::string const& key, PropList::Value& slot) {
-        std::string size = node.attribute("size").as_string("32");
-        if (size != "32") {
+    PropList::Value ReadValue(pugi::xml_node node, std::string const& key, int depth) {
+        char const* name = node.name();
+        // One comparison per element: the first letter picks the only candidate.
+        switch (name[0]) {
+        case 'p':
+            if (std::strcmp(name, "prop.list") == 0) {
+                if (depth + 1 > utils::MaxNestingDepth) {
+                    Fail(node, "lists are nested deeper than " + std::to_string(utils::MaxNestingDepth));
+                }
+                auto sub = std::make_unique<PropList>();
+                ReadList(node, *sub, depth + 1);
+                return sub;
+            }
+            break;
+        case 'u':
+            if (std::strcmp(name, "ustring") == 0) {
+                return Text(node);
+            }
+            break;
+        case 's':
+            if (std::strcmp(name, "string") == 0) {
+                return PropList::Bytes{Text(node)};
+            }
+            break;
+        case 'i':
+            if (std::strcmp(name, "int") == 0) {
+                return ReadInt(node, key);
+            }
+            break;
+        case 'f':
+            if (std::strcmp(name, "float") == 0) {
+                return Number<float>(node, key, "float");
+            }
+            if (std::strcmp(name, "false") == 0) {
+                return ReadBool(node, key, false);
+            }
+            break;
+        case 'd':
+            if (std::strcmp(name, "double") == 0) {
+                return Number<double>(node, key, "double");
+            }
+            break;
+        case 't':
+            if (std::strcmp(name, "true") == 0) {
+                return ReadBool(node, key, true);
+            }
+            break;
+        case 'a':
+            if (std::strcmp(name, "array") == 0) {
+                return ReadArray(node, key);
+            }
+            break;
+        default:
+            break;
+        }
+        Fail(node, "the key '" + key + "' has a value of unknown kind <" + std::string(name) + ">");
+    }
+
+    PropList::Value ReadBool(pugi::xml_node node, std::string const& key, bool value) {
+        if (node.first_child()) {
+            Fail(node, "the boolean of key '" + key + "' has content");
+        }
+        return value;
+    }
+
+    PropList::Value ReadInt(pugi::xml_node node, std::string const& key) {
+        char const* size = node.attribute("size").as_string("32");
+        if (std::strcmp(size, "32") != 0) {
             Fail(node, "the integer of key '" + key + "' has the unsupported size " + size);
         }
-        std::string type = node.attribute("type").as_string("signed");
-        if (type == "signed") {
-            slot = Number<std::int32_t>(node, key, "signed 32-bit integer");
-        } else if (type == "unsigned") {
-            slot = Number<std::uint32_t>(node, key, "unsigned 32-bit integer");
-        } else {
-            Fail(node, "the integer of key '" + key + "' has the unknown type '" + type + "'");
+        char const* type = node.attribute("type").as_string("signed");
+        if (std::strcmp(type, "signed") == 0) {
+            return Number<std::int32_t>(node, key, "signed 32-bit integer");
         }
+        if (std::strcmp(type, "unsigned") == 0) {
+            return Number<std::uint32_t>(node, key, "unsigned 32-bit integer");
+        }
+        Fail(node, "the integer of key '" + key + "' has the unknown type '" + type + "'");
     }
 
-    void ReadArray(pugi::xml_node node, std::string const& key, PropList::Value& slot) {
+    PropList::Value ReadArray(pugi::xml_node node, std::string const& key) {
         std::string type = node.attribute("type").as_string();
         bool ints = type == "int32";
         if (!ints && type != "utf8" && type != "utf16") {
@@ -148,13 +186,13 @@ private:
         std::vector<std::string> texts;
         std::vector<std::int32_t> numbers;
         char const* itemName = ints ? "int" : "ustring";
-        for (pugi::xml_node item : node.children()) {
-            if (SkipWhitespace(item, "a list value")) {
+        for (pugi::xml_node item = node.first_child(); item; item = item.next_sibling()) {
+            if (SkipLayoutText(item, "a list value")) {
                 continue;
             }
             if (std::strcmp(item.name(), itemName) != 0) {
-                Fail(item, "the list of key '" + key + "' holds <" + std::string(item.name()) + "> instead of <" +
-                               itemName + ">");
+                Fail(item, "the list of key '" + key + "' holds <" + std::string(item.name()) +
+                               "> instead of <" + itemName + ">");
             }
             if (ints) {
                 numbers.push_back(Number<std::int32_t>(item, key, "signed 32-bit integer"));
@@ -163,31 +201,32 @@ private:
             }
         }
         if (ints) {
-            slot = std::move(numbers);
-        } else if (type == "utf8") {
-            slot = std::move(texts);
-        } else {
-            std::vector<std::u16string> wide;
-            wide.reserve(texts.size());
-            for (std::string const& t : texts) {
-                wide.push_back(utility::UTF8to16(t));
-            }
-            slot = std::move(wide);
+            return numbers;
         }
+        if (type == "utf8") {
+            return texts;
+        }
+        std::vector<std::u16string> wide;
+        wide.reserve(texts.size());
+        for (std::string const& t : texts) {
+            wide.push_back(utility::UTF8to16(t));
+        }
+        return wide;
     }
 
     // The unescaped text content of an element that must hold only text.
     std::string Text(pugi::xml_node node) const {
         std::string out;
-        for (pugi::xml_node child : node.children()) {
-            if (child.type() == pugi::node_pcdata) {
+        for (pugi::xml_node child = node.first_child(); child; child = child.next_sibling()) {
+            pugi::xml_node_type type = child.type();
+            if (type == pugi::node_pcdata) {
                 std::string problem;
                 if (!Unescape(child.value(), out, problem)) {
                     Fail(child, "the text holds " + problem);
                 }
-            } else if (child.type() == pugi::node_cdata) {
+            } else if (type == pugi::node_cdata) {
                 out += child.value();
-            } else if (child.type() == pugi::node_element) {
+            } else if (type == pugi::node_element) {
                 Fail(child, "the element <" + std::string(child.name()) + "> stands inside <" + node.name() +
                                 ">, which holds only text");
             }
@@ -281,7 +320,8 @@ void Parse(std::string& buffer, PropList& list, std::u16string const& sourceName
         doc.load_buffer_inplace(buffer.data(), buffer.size(), ParseOptions, pugi::encoding_utf8);
     if (!parsed) {
         config::ThrowError(config::errors::MalformedPropList, sourceName,
-                           std::string(parsed.description()) + " (at byte " + std::to_string(parsed.offset) + ")");
+                           std::string(parsed.description()) + " (at byte " + std::to_string(parsed.offset) +
+                               ")");
     }
     pugi::xml_node root = SingleRootElement(doc, builder);
     pugi::xml_node listNode;

@@ -6,10 +6,10 @@
 
 namespace orvcore::utility {
 
-std::u16string ReplaceInString(std::u16string const& templ, std::u16string const& r0, std::u16string const& r1,
-                               std::u16string const& r2, std::u16string const& r3, std::u16string const& r4,
-                               std::u16string const& r5, std::u16string const& r6, std::u16string const& r7,
-                               std::u16string const& r8, std::u16string const& r9) {
+std::u16string ReplaceInString(std::u16string const& templ, std::u16string const& r0,
+                               std::u16string const& r1, std::u16string const& r2, std::u16string const& r3,
+                               std::u16string const& r4, std::u16string const& r5, std::u16string const& r6,
+                               std::u16string const& r7, std::u16string const& r8, std::u16string const& r9) {
     std::u16string const* values[10] = {&r0, &r1, &r2, &r3, &r4, &r5, &r6, &r7, &r8, &r9};
     std::u16string out;
     out.reserve(templ.size());
@@ -26,8 +26,12 @@ std::u16string ReplaceInString(std::u16string const& templ, std::u16string const
 }
 
 namespace {
-bool IsHighSurrogate(char16_t c) { return c >= 0xD800 && c <= 0xDBFF; }
-bool IsLowSurrogate(char16_t c) { return c >= 0xDC00 && c <= 0xDFFF; }
+bool IsHighSurrogate(char16_t c) {
+    return c >= 0xD800 && c <= 0xDBFF;
+}
+bool IsLowSurrogate(char16_t c) {
+    return c >= 0xDC00 && c <= 0xDFFF;
+}
 } // namespace
 
 std::u16string TruncateUIStringInMiddle(std::u16string const& text, std::size_t maximum, double scale) {

@@ -64,7 +64,9 @@ char32_t DecodeUTF8(std::string const& text, std::size_t& i) {
     return cp;
 }
 
-template <typename Char> bool IsSpace(Char c) { return c == Char(' ') || c == Char('\t'); }
+template <typename Char> bool IsSpace(Char c) {
+    return c == Char(' ') || c == Char('\t');
+}
 
 } // namespace
 
@@ -101,7 +103,8 @@ std::string UTF16to8(std::u16string const& utf16) {
     out.reserve(utf16.size());
     for (std::size_t i = 0; i < utf16.size(); ++i) {
         char32_t c = utf16[i];
-        if (c >= 0xD800 && c <= 0xDBFF && i + 1 < utf16.size() && utf16[i + 1] >= 0xDC00 && utf16[i + 1] <= 0xDFFF) {
+        if (c >= 0xD800 && c <= 0xDBFF && i + 1 < utf16.size() && utf16[i + 1] >= 0xDC00 &&
+            utf16[i + 1] <= 0xDFFF) {
             c = 0x10000 + ((c - 0xD800) << 10) + (utf16[i + 1] - 0xDC00);
             ++i;
         } else if (c >= 0xD800 && c <= 0xDFFF) {
