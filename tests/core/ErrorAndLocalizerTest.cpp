@@ -51,6 +51,45 @@ TEST_F(LocalizerTest, RaisedErrorLeadsBackToItsTableEntry) {
     EXPECT_EQ(outside.Message(), u"Z");
 }
 
+TEST_F(LocalizerTest, EveryPublicErrorHasItsFixedKeyAndMessage) {
+    struct Expected {
+        int facility, code;
+        char const* key;
+        char16_t const* message;
+    };
+    Expected const expected[] = {
+        {102, 20, "$$$/orvworkspace/Error/CannotCreateOverlayWindow", u"Unable to create overlay window."},
+        {102, 21, "$$$/orvworkspace/Error/CannotCreateEmptyOverlayWindow",
+         u"Attempted to create empty overlay window."},
+        {102, 22, "$$$/orvworkspace/workspace/Error/InvalidWorkspace", u"Not a valid workspace definition."},
+        {102, 23, "$$$/orvworkspace/workspace/Error/UnableToLoadWorkspace",
+         u"Unable to load workspace; Incompatible workspace definition version."},
+        {102, 24, "$$$/orvworkspace/workspace/Error/WorkspaceManager/AlreadyIntialized",
+         u"Workspaces Manager already initialized"},
+        {102, 25, "$$$/orvworkspace/workspace/Error/WorkspaceManager/NotInitialized",
+         u"Workspaces Manager not initialized"},
+        {102, 26, "$$$/orvworkspace/workspace/Error/WorkspaceManager/WorkspaceAlreadyExists",
+         u"A workspace with this name already exists."},
+        {102, 27, "$$$/orvworkspace/workspace/Error/WorkspaceManager/CannotCreateWorkspace",
+         u"Could not create workspace."},
+        {102, 28, "$$$/orvworkspace/workspace/Error/WorkspaceManager/UnknownWorkspace",
+         u"Unknown workspace."},
+        {105, 20, "$$$/orvworkspace/utility/Error/ResourceUtils/UnableToAccessResource",
+         u"Unable to access resource."},
+        {105, 21, "$$$/orvcore/utility/Error/InvalidTypeConversion", u"Invalid type conversion."},
+        {107, 0, "$$$/orvcore/geom/matrix/Error/NonInvertableMatrix", u"Matrix cannot be inverted."},
+        {108, 20, "$$$/orvworkspace/sharedui/Error/InvalidToolMapAccess", u"Invalid tool map access."},
+    };
+    for (Expected const& x : expected) {
+        ErrorEntry const* entry = FindErrorEntry(x.facility, x.code);
+        ASSERT_NE(entry, nullptr) << x.key;
+        EXPECT_EQ(std::string(entry->key), std::string(x.key) + "=" + orvcore::utility::UTF16to8(x.message));
+        Error e = Catch([&] { ThrowError(*entry); });
+        EXPECT_EQ(e.Message(), x.message);
+        EXPECT_EQ(e.Entry(), entry);
+    }
+}
+
 TEST_F(LocalizerTest, TableHoldsEveryErrorOnceWithItsDefaultText) {
     std::set<std::pair<int, int>> codes;
     for (ErrorEntry const* e = ErrorTableBegin(); e != ErrorTableEnd(); ++e) {

@@ -74,6 +74,7 @@ TEST(PrefDir, EnvironmentDecidesAndFolderIsCreated) {
 TEST(DirAndFile, NamesAndExistence) {
     TempDir tmp;
     Dir saved(Dir(tmp.U16()), u"SavedWorkspaces");
+    EXPECT_EQ(Dir(u"/a/b").FullPath(), u"/a/b");
     EXPECT_FALSE(saved.Exists());
     EXPECT_TRUE(saved.Create());
     EXPECT_TRUE(saved.Exists());
@@ -121,6 +122,9 @@ TEST(FileUtils, UniqueFileNameSkipsTakenNamesAndCreateNewFileRefusesThem) {
     fs::create_directory(tmp.Path() / "UserWorkspace3.xml"); // a folder takes the name too
     EXPECT_EQ(FileUtils::UniqueFileName(tmp.U16(), u"UserWorkspace", u".xml"), tmp.U16("UserWorkspace4.xml"));
     EXPECT_FALSE(FileUtils::CreateNewFile(tmp.U16("missing/folder.xml")));
+    // A dangling link still takes its name: creating a file there would fail.
+    fs::create_symlink(tmp.Path() / "nowhere", tmp.Path() / "UserWorkspace4.xml");
+    EXPECT_EQ(FileUtils::UniqueFileName(tmp.U16(), u"UserWorkspace", u".xml"), tmp.U16("UserWorkspace5.xml"));
 }
 
 TEST(FileUtils, ContainedFilesListsOnlyFilesInNameOrder) {
@@ -146,6 +150,10 @@ TEST(FileUtils, CopyRemoveAndExistence) {
     EXPECT_EQ(fs::status(to).permissions() & fs::perms::all,
               fs::perms::owner_read | fs::perms::owner_write | fs::perms::group_read);
     EXPECT_FALSE(FileUtils::Copy(tmp.U16("absent.xml"), TempDir::PathU16(to)));
+    EXPECT_EQ(orvtest::ReadFile(to), "new content");
+    // A source that opens but fails to read (this one answers every read with an I/O error) must
+    // not replace the target with a truncated copy.
+    EXPECT_FALSE(FileUtils::Copy(u"/proc/self/mem", TempDir::PathU16(to)));
     EXPECT_EQ(orvtest::ReadFile(to), "new content");
 
     EXPECT_TRUE(FileUtils::FileExists(TempDir::PathU16(to)));
@@ -177,6 +185,9 @@ TEST(FileUtils, ReadWholeFileRefusesOversizedAndMissingFiles) {
     }
     EXPECT_THROW(FileUtils::ReadWholeFile(tmp.U16("absent"), 100), orvcore::config::Error);
     EXPECT_THROW(FileUtils::ReadWholeFile(tmp.U16(), 100), orvcore::config::Error);
+    // A FIFO in a document's place is refused at once instead of waiting for a writer.
+    ASSERT_EQ(::mkfifo((tmp.Path() / "fifo").c_str(), 0600), 0);
+    EXPECT_THROW(FileUtils::ReadWholeFile(tmp.U16("fifo"), 100), orvcore::config::Error);
 }
 
 TEST(FileUtils, FailedWriteLeavesThePreviousFileWhole) {

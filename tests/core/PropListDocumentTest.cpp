@@ -5,10 +5,13 @@
 #include "host/core/PropListUtils.h"
 #include "support/TempDir.h"
 
+#include <algorithm>
 #include <cfloat>
 #include <climits>
 #include <cmath>
+#include <csignal>
 #include <gtest/gtest.h>
+#include <sys/resource.h>
 
 using orvcore::config::Error;
 using orvcore::proplist::PropList;
@@ -150,7 +153,7 @@ TEST(PropListDocument, ExtremeRealsReadBackInsteadOfBreakingTheDocument) {
     EXPECT_TRUE(back.GetValue("ninf", f));
     EXPECT_EQ(f, -HUGE_VALF);
     EXPECT_TRUE(back.GetValue("tinyDouble", d));
-    EXPECT_GE(d, 0.0);
+    EXPECT_GT(d, 0.0);
     EXPECT_LT(d, 1e-300);
     EXPECT_TRUE(back.GetValue("tinyFloat", f));
     EXPECT_NEAR(f, 1e-40f, 1e-44f);
@@ -332,4 +335,55 @@ TEST(PropListDocument, FragmentsMustBeLists) {
     EXPECT_THROW(ParseDocument("<prop.list></prop.list>", list, u"doc"), Error); // a document needs its map
     ReadPropList("<prop.list>\r\n</prop.list>\r\n", list);
     EXPECT_TRUE(list.IsEmpty());
+}
+
+TEST(PropListDocument, KeysOutOfOrderAreSortedAndRepeatsRefused) {
+    // Written by another tool: keys in descending order, many of them.
+    std::string xml = "<prop.list>";
+    for (int i = 20000; i > 0; --i) {
+        xml += "<prop.pair><key>k" + std::to_string(i) + "</key><int>" + std::to_string(i) +
+               "</int></prop.pair>";
+    }
+    xml += "</prop.list>";
+    PropList list;
+    ReadPropList(xml, list);
+    ASSERT_EQ(list.Size(), 20000u);
+    std::vector<std::string> keys = list.Keys();
+    EXPECT_TRUE(std::is_sorted(keys.begin(), keys.end()));
+    std::int32_t v = 0;
+    EXPECT_TRUE(list.GetValue("k777", v));
+    EXPECT_EQ(v, 777);
+    std::string repeated = "<prop.list><prop.pair><key>b</key><true/></prop.pair>"
+                           "<prop.pair><key>a</key><true/></prop.pair>"
+                           "<prop.pair><key>b</key><false/></prop.pair></prop.list>";
+    Error e = CatchError([&] { ReadPropList(repeated, list); });
+    EXPECT_NE(std::string(e.what()).find("'b' occurs twice"), std::string::npos) << e.what();
+    EXPECT_EQ(list.Size(), 20000u);
+}
+
+TEST(PropListDocument, FailedSaveKeepsThePreviousDocument) {
+    TempDir tmp;
+    PropList small;
+    small.SetValue("v", 1);
+    SavePropList(tmp.U16("doc.xml"), small);
+    PropList big;
+    big.SetValue("text", std::string(100000, 'x'));
+    struct rlimit old {};
+    ASSERT_EQ(::getrlimit(RLIMIT_FSIZE, &old), 0);
+    auto oldHandler = std::signal(SIGXFSZ, SIG_IGN);
+    struct rlimit limited = old;
+    limited.rlim_cur = 4096;
+    ASSERT_EQ(::setrlimit(RLIMIT_FSIZE, &limited), 0);
+    bool raised = false;
+    try {
+        SavePropList(tmp.U16("doc.xml"), big);
+    } catch (Error const&) {
+        raised = true;
+    }
+    ::setrlimit(RLIMIT_FSIZE, &old);
+    std::signal(SIGXFSZ, oldHandler);
+    EXPECT_TRUE(raised);
+    PropList back;
+    ASSERT_TRUE(LoadPropList(tmp.U16("doc.xml"), back, true));
+    EXPECT_EQ(back, small);
 }

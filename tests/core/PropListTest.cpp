@@ -2,6 +2,7 @@
 #include "host/core/PropList.h"
 
 #include <climits>
+#include <cmath>
 #include <gtest/gtest.h>
 
 using orvcore::proplist::PropList;
@@ -75,6 +76,14 @@ TEST(PropList, IntegersCrossSignednessOnlyWhenTheyFit) {
     EXPECT_TRUE(list.GetValue("f", d));
     EXPECT_EQ(d, 0.25);
     EXPECT_FALSE(list.GetValue("neg", d)); // no integer-to-real guessing
+    // A double a float cannot hold does not read as one (say a damaged splitter placement).
+    list.SetValue("huge", 1e300);
+    f = 0.5f;
+    EXPECT_FALSE(list.GetValue("huge", f));
+    EXPECT_EQ(f, 0.5f);
+    list.SetValue("inf", HUGE_VAL);
+    EXPECT_TRUE(list.GetValue("inf", f));
+    EXPECT_EQ(f, HUGE_VALF);
 }
 
 TEST(PropList, SetValueReplacesWhateverWasThere) {

@@ -4,7 +4,9 @@
 #include "host/core/TextConversion.h"
 
 #include <cstdlib>
+#include <pwd.h>
 #include <system_error>
+#include <unistd.h>
 
 namespace orvcore::filesupport {
 
@@ -33,10 +35,20 @@ Dir Dir::PrefDir() {
         path = fs::path(xdg) / "orvworkspace";
     } else {
         std::string home = Environment("HOME");
-        path = fs::path(home.empty() ? std::string(".") : home) / ".config" / "orvworkspace";
+        if (home.empty()) {
+            struct passwd const* user = ::getpwuid(::getuid());
+            home = user && user->pw_dir ? user->pw_dir : ".";
+        }
+        path = fs::path(home) / ".config" / "orvworkspace";
     }
-    Dir dir(path);
+    Dir dir = FromFilesystemPath(path);
     dir.Create();
+    return dir;
+}
+
+Dir Dir::FromFilesystemPath(fs::path path) {
+    Dir dir(std::u16string{});
+    dir.path_ = std::move(path);
     return dir;
 }
 

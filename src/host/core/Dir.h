@@ -14,8 +14,8 @@ public:
     static Dir PrefDir();
 
     explicit Dir(std::u16string const& path);
-    explicit Dir(std::filesystem::path path)
-        : path_(std::move(path)) {}
+    // A folder named by a file-system path (bytes, as the system gives them).
+    static Dir FromFilesystemPath(std::filesystem::path path);
     // The folder `name` inside `parent`.
     Dir(Dir const& parent, std::u16string const& name);
 

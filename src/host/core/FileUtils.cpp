@@ -12,6 +12,7 @@
 #include <cstring>
 #include <fcntl.h>
 #include <fstream>
+#include <string_view>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -45,18 +46,22 @@ bool FileUtils::ContainedFiles(std::u16string const& folder, std::vector<std::u1
 
 std::u16string FileUtils::UniqueFileName(std::u16string const& folder, std::u16string const& base,
                                          std::u16string const& extension) {
-    for (unsigned long n = 1;; ++n) {
+    // A name counts as taken when anything at all is there, a dangling link included, or when the
+    // folder cannot say; the search gives up (empty result) rather than loop for ever.
+    for (unsigned long n = 1; n <= 100000; ++n) {
         std::u16string path;
         BuildPathSpec(folder, base + AsciiToUTF16(std::to_string(n)) + extension, path);
         std::error_code ec;
-        if (!fs::exists(ToPath(path), ec) && !ec) {
+        fs::file_status status = fs::symlink_status(ToPath(path), ec);
+        if (status.type() == fs::file_type::not_found) {
             return path;
         }
     }
+    return {};
 }
 
 bool FileUtils::CreateNewFile(std::u16string const& path) {
-    int fd = ::open(ToPath(path).c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0644);
+    int fd = ::open(ToPath(path).c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666);
     if (fd < 0) {
         return false;
     }
@@ -73,6 +78,16 @@ bool FileUtils::RemoveFile(std::u16string const& path) {
 }
 
 namespace {
+
+// The mode a new file gets from open(..., 0666): read and write as the process's umask allows.
+mode_t NewFileMode() {
+    static mode_t const mode = [] {
+        mode_t mask = ::umask(0);
+        ::umask(mask);
+        return static_cast<mode_t>(0666 & ~mask);
+    }();
+    return mode;
+}
 
 // An open temporary file beside a target; removed on destruction unless it was renamed over the
 // target.
@@ -101,7 +116,7 @@ public:
     bool IsOpen() const { return fd_ >= 0; }
     int Error() const { return error_; }
 
-    bool Write(std::string const& bytes) {
+    bool Write(std::string_view bytes) {
         std::size_t done = 0;
         while (done < bytes.size()) {
             ssize_t n = ::write(fd_, bytes.data() + done, bytes.size() - done);
@@ -121,7 +136,7 @@ public:
     // over the target.
     bool Commit(fs::path const& target) {
         struct stat old {};
-        mode_t mode = ::stat(target.c_str(), &old) == 0 ? (old.st_mode & 07777) : 0644;
+        mode_t mode = ::stat(target.c_str(), &old) == 0 ? (old.st_mode & 07777) : NewFileMode();
         if (::fchmod(fd_, mode) != 0 || ::fsync(fd_) != 0) {
             error_ = errno;
             return false;
@@ -160,22 +175,36 @@ bool FileUtils::Copy(std::u16string const& from, std::u16string const& to) {
     if (!FileExists(from)) {
         return false;
     }
+    // POSIX reads rather than a stream: a stream cannot tell a read error from the end of the file,
+    // and would rename a truncated copy over the target as if all went well.
+    int in = ::open(ToPath(from).c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
+    if (in < 0) {
+        return false;
+    }
+    struct Closer {
+        int fd;
+        ~Closer() { ::close(fd); }
+    } closer{in};
     fs::path target = ToPath(to);
     TempFile temp(target);
     if (!temp.IsOpen()) {
         return false;
     }
-    std::ifstream in(ToPath(from), std::ios::binary);
-    char buffer[64 * 1024];
-    while (in) {
-        in.read(buffer, sizeof buffer);
-        std::streamsize n = in.gcount();
-        if (n > 0 && !temp.Write(std::string(buffer, static_cast<std::size_t>(n)))) {
+    std::string buffer(64 * 1024, '\0');
+    for (;;) {
+        ssize_t n = ::read(in, buffer.data(), buffer.size());
+        if (n < 0 && errno == EINTR) {
+            continue;
+        }
+        if (n < 0) {
             return false;
         }
-    }
-    if (in.bad()) {
-        return false;
+        if (n == 0) {
+            break;
+        }
+        if (!temp.Write(std::string_view(buffer.data(), static_cast<std::size_t>(n)))) {
+            return false;
+        }
     }
     return temp.Commit(target);
 }
@@ -203,7 +232,8 @@ bool FileUtils::RemoveReadOnlyAttribute(std::u16string const& path) {
 std::string FileUtils::ReadWholeFile(std::u16string const& path, std::size_t maxBytes) {
     using config::errors::CannotReadFile;
     fs::path p = ToPath(path);
-    int fd = ::open(p.c_str(), O_RDONLY | O_CLOEXEC);
+    // Non-blocking, so a FIFO in the file's place cannot stall the open; it is refused below.
+    int fd = ::open(p.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
     if (fd < 0) {
         config::ThrowError(CannotReadFile, path, Reason(errno));
     }

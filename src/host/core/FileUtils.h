@@ -16,7 +16,8 @@ public:
     static bool ContainedFiles(std::u16string const& folder, std::vector<std::u16string>& list);
 
     // The full path of a file in folder that does not exist yet: base, a number from 1 upwards and
-    // extension ("UserWorkspace1.xml", "UserWorkspace2.xml", ...). The file is not created.
+    // extension ("UserWorkspace1.xml", "UserWorkspace2.xml", ...). The file is not created. Empty
+    // when no free name is found (the folder cannot be read, or a hundred thousand are taken).
     static std::u16string UniqueFileName(std::u16string const& folder, std::u16string const& base,
                                          std::u16string const& extension);
 

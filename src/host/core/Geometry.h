@@ -4,8 +4,34 @@
 
 #include <algorithm>
 #include <cstdint>
+#include <limits>
+#include <type_traits>
 
 namespace orvcore::geom {
+
+namespace detail {
+// Integer sums and differences saturate at the type's limits: rectangles read from a damaged
+// document may hold extreme values, and an overflow there must not become undefined behaviour.
+template <typename T> constexpr T Clamp(long long v) {
+    return v < static_cast<long long>(std::numeric_limits<T>::lowest()) ? std::numeric_limits<T>::lowest()
+           : v > static_cast<long long>(std::numeric_limits<T>::max())  ? std::numeric_limits<T>::max()
+                                                                        : static_cast<T>(v);
+}
+template <typename T> constexpr T Add(T a, T b) {
+    if constexpr (std::is_integral_v<T>) {
+        return Clamp<T>(static_cast<long long>(a) + static_cast<long long>(b));
+    } else {
+        return a + b;
+    }
+}
+template <typename T> constexpr T Sub(T a, T b) {
+    if constexpr (std::is_integral_v<T>) {
+        return Clamp<T>(static_cast<long long>(a) - static_cast<long long>(b));
+    } else {
+        return a - b;
+    }
+}
+} // namespace detail
 
 // A position, or a size when x is read as the width and y as the height.
 template <typename T> struct PointT {
@@ -17,14 +43,15 @@ template <typename T> struct PointT {
         : x(px)
         , y(py) {}
 
-    constexpr PointT operator+(PointT const& o) const { return {T(x + o.x), T(y + o.y)}; }
-    constexpr PointT operator-(PointT const& o) const { return {T(x - o.x), T(y - o.y)}; }
+    constexpr PointT operator+(PointT const& o) const { return {detail::Add(x, o.x), detail::Add(y, o.y)}; }
+    constexpr PointT operator-(PointT const& o) const { return {detail::Sub(x, o.x), detail::Sub(y, o.y)}; }
     constexpr bool operator==(PointT const& o) const { return x == o.x && y == o.y; }
     constexpr bool operator!=(PointT const& o) const { return !(*this == o); }
 };
 
 // A rectangle as left, top, width and height; the right edge is left + width and the bottom edge
 // top + height, so a rectangle contains the points with left <= x < right and top <= y < bottom.
+// Integer arithmetic saturates rather than overflows.
 template <typename T> struct RectT {
     T left{};
     T top{};
@@ -40,12 +67,12 @@ template <typename T> struct RectT {
 
     // Builds a rectangle from its edges; the edges may come in any order.
     static constexpr RectT FromEdges(T l, T t, T r, T b) {
-        return RectT(std::min(l, r), std::min(t, b), T(std::max(l, r) - std::min(l, r)),
-                     T(std::max(t, b) - std::min(t, b)));
+        return RectT(std::min(l, r), std::min(t, b), detail::Sub(std::max(l, r), std::min(l, r)),
+                     detail::Sub(std::max(t, b), std::min(t, b)));
     }
 
-    constexpr T Right() const { return T(left + width); }
-    constexpr T Bottom() const { return T(top + height); }
+    constexpr T Right() const { return detail::Add(left, width); }
+    constexpr T Bottom() const { return detail::Add(top, height); }
     constexpr PointT<T> TopLeft() const { return {left, top}; }
     constexpr PointT<T> Size() const { return {width, height}; }
     constexpr bool IsEmpty() const { return width <= T(0) || height <= T(0); }
@@ -65,7 +92,7 @@ template <typename T> struct RectT {
         if (rr <= l || b <= t) {
             return RectT();
         }
-        return RectT(l, t, T(rr - l), T(b - t));
+        return RectT(l, t, detail::Sub(rr, l), detail::Sub(b, t));
     }
 
     // The smallest rectangle holding both; an empty operand does not count.
@@ -80,10 +107,13 @@ template <typename T> struct RectT {
                          std::max(Bottom(), r.Bottom()));
     }
 
-    constexpr RectT Offset(T dx, T dy) const { return RectT(T(left + dx), T(top + dy), width, height); }
+    constexpr RectT Offset(T dx, T dy) const {
+        return RectT(detail::Add(left, dx), detail::Add(top, dy), width, height);
+    }
     // Moves every edge inwards by the given amounts (outwards when negative).
     constexpr RectT Inset(T dx, T dy) const {
-        return RectT(T(left + dx), T(top + dy), T(width - 2 * dx), T(height - 2 * dy));
+        return RectT(detail::Add(left, dx), detail::Add(top, dy), detail::Sub(detail::Sub(width, dx), dx),
+                     detail::Sub(detail::Sub(height, dy), dy));
     }
 
     constexpr bool operator==(RectT const& o) const {

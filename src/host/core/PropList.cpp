@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <charconv>
+#include <cmath>
 #include <limits>
 
 namespace orvcore::proplist {
@@ -167,6 +168,10 @@ bool PropList::GetValue(std::string const& key, std::uint32_t& out) const {
 bool PropList::GetValue(std::string const& key, float& out) const {
     double d = 0;
     if (!GetValue(key, d)) {
+        return false;
+    }
+    // A finite double beyond the float range has no float value; converting it is undefined.
+    if (std::isfinite(d) && std::fabs(d) > std::numeric_limits<float>::max()) {
         return false;
     }
     out = static_cast<float>(d);

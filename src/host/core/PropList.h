@@ -47,7 +47,8 @@ public:
     // Each GetValue returns whether a value of a matching kind is under the key, and only then
     // writes out; on false the caller's default stays. Integers of the other signedness match when
     // their value fits, floats and doubles match each other, UTF-8 and byte strings match a text,
-    // and the two kinds of string list match each other.
+    // and the two kinds of string list match each other. A double beyond the float range does not
+    // match a float.
     virtual bool GetValue(std::string const& key, std::string& out) const;
     virtual bool GetValue(std::string const& key, std::u16string& out) const;
     virtual bool GetValue(std::string const& key, bool& out) const;
@@ -72,8 +73,14 @@ public:
     virtual void SetValue(std::string const& key, std::vector<std::string> const& value);
     virtual void SetValue(std::string const& key, std::vector<std::u16string> const& value);
     // Literal texts are texts, not booleans.
-    void SetValue(std::string const& key, char const* value) { SetValue(key, std::string(value)); }
-    void SetValue(std::string const& key, char16_t const* value) { SetValue(key, std::u16string(value)); }
+    void SetValue(std::string const& key, char const* value) {
+        SetValue(key, std::string(value ? value : ""));
+    }
+    void SetValue(std::string const& key, char16_t const* value) {
+        SetValue(key, std::u16string(value ? value : u""));
+    }
+    // Any other pointer would silently become a boolean.
+    template <typename T> void SetValue(std::string const& key, T const* value) = delete;
     void SetByteString(std::string const& key, std::string const& bytes);
 
     // The sub-list under the key, or null when there is none or the value is of another kind.

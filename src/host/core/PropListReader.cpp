@@ -7,6 +7,7 @@
 #include "host/core/PropListXml.h"
 #include "host/core/TextConversion.h"
 
+#include <algorithm>
 #include <charconv>
 #include <cstring>
 #include <pugixml.hpp>
@@ -38,6 +39,7 @@ public:
             }
             ReadPair(child, list, depth);
         }
+        Order(node, list);
     }
 
     [[noreturn]] void Fail(pugi::xml_node at, std::string const& problem) const {
@@ -83,17 +85,24 @@ private:
             Fail(pair, keyNode ? "a pair has no value" : "a pair has no key");
         }
         std::string key = Text(keyNode);
-        // A list holds each key once; keeping either of two values silently could lose the other.
-        auto& entries = list.entries_;
-        bool append = entries.empty() || entries.back().key < key;
-        if (!append && list.HasKey(key)) {
-            Fail(pair, "the key '" + key + "' occurs twice in one list");
-        }
         PropList::Value value = ReadValue(valueNode, key, depth);
-        if (append) {
-            entries.push_back(PropList::Entry{std::move(key), std::move(value)});
-        } else {
-            list.Slot(key) = std::move(value);
+        list.entries_.push_back(PropList::Entry{std::move(key), std::move(value)});
+    }
+
+    // Pairs are appended as they come; a list that arrived out of order is sorted once (never one
+    // insertion per pair, which a hostile document could make quadratic). A list holds each key
+    // once, and keeping either of two values silently could lose the other, so a repeat is an error.
+    void Order(pugi::xml_node node, PropList& list) const {
+        auto& entries = list.entries_;
+        auto byKey = [](PropList::Entry const& a, PropList::Entry const& b) { return a.key < b.key; };
+        if (!std::is_sorted(entries.begin(), entries.end(), byKey)) {
+            std::sort(entries.begin(), entries.end(), byKey);
+        }
+        auto repeat = std::adjacent_find(
+            entries.begin(), entries.end(),
+            [](PropList::Entry const& a, PropList::Entry const& b) { return a.key == b.key; });
+        if (repeat != entries.end()) {
+            Fail(node, "the key '" + repeat->key + "' occurs twice in one list");
         }
     }
 

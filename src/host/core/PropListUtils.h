@@ -10,8 +10,10 @@
 
 namespace orvcore::proplist::utils {
 
-// Documents larger than this are refused before reading, so a runaway file cannot exhaust memory.
-inline constexpr std::size_t MaxDocumentBytes = std::size_t(256) << 20;
+// Documents larger than this are refused before reading, so a runaway file cannot exhaust memory:
+// the parsed element tree can be some twenty times the size of a document of tiny elements. Saved
+// workspaces are a few hundred kilobytes.
+inline constexpr std::size_t MaxDocumentBytes = std::size_t(32) << 20;
 // Lists nested deeper than this are refused; no document of the library comes near it.
 inline constexpr int MaxNestingDepth = 256;
 
