@@ -140,11 +140,39 @@ public:
     // Writes the tree as a Graphviz digraph.
     void DumpToGraphvis(std::ostream& out) const;
 
+    // While a pass is under way, splitters remember the reports of their subtrees (0: no pass).
+    // Within a refresh only minimum sizes are remembered (the refresh itself changes the frames'
+    // constraints); within a fit, constraints and stretchiness too. Nothing a pass does changes a
+    // report it has already given out: a subtree's reports are asked before any of its frames is
+    // placed, and a frame's reports depend on that frame alone. This keeps a pass linear in the
+    // number of nodes instead of growing with their depth.
+    enum class ReportPassKind { None, Refresh, Fit };
+    unsigned long GetReportPass() const { return reportCacheEnabled ? reportPass_ : 0; }
+    // Turns the remembering off process-wide, so a test can check that it changes no result.
+    static void SetReportCacheEnabled(bool enabled) { reportCacheEnabled = enabled; }
+    ReportPassKind GetReportPassKind() const { return reportPassKind_; }
+
 protected:
     // The real root element: the root splitter's first child.
     LayoutManagerElement* GetRoot() const;
 
 private:
+    // Opens a report pass of a kind for its lifetime, unless one of that kind is already open.
+    class ReportPassScope {
+    public:
+        ReportPassScope(LayoutManager& manager, ReportPassKind kind);
+        ~ReportPassScope();
+        ReportPassScope(ReportPassScope const&) = delete;
+        ReportPassScope& operator=(ReportPassScope const&) = delete;
+
+    private:
+        LayoutManager& manager_;
+        unsigned long savedPass_;
+        ReportPassKind savedKind_;
+    };
+
+    // The recursive refresh below RefreshVisibility, inside its report pass.
+    bool RefreshBranch(LayoutManagerElement* e);
     // Whether e hangs below the root splitter through links that agree both ways.
     bool IsInTree(LayoutManagerElement const* e) const;
     // Recomputes visibility flags, saved placements and frame constraints below e; whether e's
@@ -173,6 +201,10 @@ private:
     bool leftStaticBorderAsSecondTop_ = false;
     Frame* maximizedFrame_ = nullptr;
     std::list<Frame*> framesHiddenByMaximize_;
+    static inline bool reportCacheEnabled = true;
+    unsigned long reportPass_ = 0;
+    unsigned long lastReportPass_ = 0;
+    ReportPassKind reportPassKind_ = ReportPassKind::None;
 };
 
 } // namespace orvworkspace::workspace

@@ -24,7 +24,27 @@ long Sign(long v) {
 
 } // namespace
 
+LayoutManager::ReportPassScope::ReportPassScope(LayoutManager& manager, ReportPassKind kind)
+    : manager_(manager)
+    , savedPass_(manager.reportPass_)
+    , savedKind_(manager.reportPassKind_) {
+    if (manager.reportPassKind_ != kind) {
+        manager.reportPass_ = ++manager.lastReportPass_;
+        manager.reportPassKind_ = kind;
+    }
+}
+
+LayoutManager::ReportPassScope::~ReportPassScope() {
+    manager_.reportPass_ = savedPass_;
+    manager_.reportPassKind_ = savedKind_;
+}
+
 bool LayoutManager::RefreshVisibility(LayoutManagerElement* e) {
+    ReportPassScope pass(*this, ReportPassKind::Refresh);
+    return RefreshBranch(e);
+}
+
+bool LayoutManager::RefreshBranch(LayoutManagerElement* e) {
     if (Frame* f = AsFrame(e)) {
         f->SetConstraintSize(true);
         return f->IsFrameShown();
@@ -33,10 +53,11 @@ bool LayoutManager::RefreshVisibility(LayoutManagerElement* e) {
     if (!s) {
         return false;
     }
+    // The saved placement reads the subtree's flags before the refresh below changes them.
     s->SavePlacementState();
     s->SetConstrained(false);
-    s->SetLeftOrTopVisible(RefreshVisibility(s->GetLeftOrTop()));
-    s->SetRightOrBottomVisible(RefreshVisibility(s->GetRightOrBottom()));
+    s->SetLeftOrTopVisible(RefreshBranch(s->GetLeftOrTop()));
+    s->SetRightOrBottomVisible(RefreshBranch(s->GetRightOrBottom()));
     return s->IsLeftOrTopSubtreeVisible() || s->IsRightOrBottomSubtreeVisible();
 }
 
@@ -157,6 +178,7 @@ void LayoutManager::FitNodeToRect(LayoutManagerElement* e, RectT rect, RectT con
     if (Frame* f = AsFrame(e)) {
         PlaceFrame(f, rect);
     } else if (Splitter* s = AsSplitter(e)) {
+        ReportPassScope pass(*this, ReportPassKind::Fit);
         FitSplitter(s, rect, containing, distribute, preferFirst, keepBarPositions, delta);
     }
 }

@@ -126,13 +126,34 @@ PointT Splitter::Combine(PointT a, PointT b) const {
     return PointT(std::max(a.x, b.x), a.y + b.y);
 }
 
+bool Splitter::CachedReport(unsigned long& stamp, bool fitOnly) const {
+    LayoutManager* manager = GetLayoutManager();
+    unsigned long pass = manager ? manager->GetReportPass() : 0;
+    if (pass == 0 || (fitOnly && manager->GetReportPassKind() != LayoutManager::ReportPassKind::Fit)) {
+        return false;
+    }
+    if (stamp == pass) {
+        return true;
+    }
+    stamp = pass; // the caller stores the value it computes now
+    return false;
+}
+
 PointT Splitter::DoGetMinimumSize() const {
+    if (CachedReport(minimumStamp_, false)) {
+        return cachedMinimum_;
+    }
     LayoutManagerElement* a = CountedFirst();
     LayoutManagerElement* b = CountedSecond();
-    return Combine(a ? a->GetMinimumSize() : PointT(), b ? b->GetMinimumSize() : PointT());
+    cachedMinimum_ = Combine(a ? a->GetMinimumSize() : PointT(), b ? b->GetMinimumSize() : PointT());
+    return cachedMinimum_;
 }
 
 void Splitter::DoGetConstraintSize(PointT& size) const {
+    if (CachedReport(constraintStamp_, true)) {
+        size = cachedConstraint_;
+        return;
+    }
     PointT ca, cb;
     if (LayoutManagerElement* a = CountedFirst()) {
         a->GetConstraintSize(ca);
@@ -140,13 +161,18 @@ void Splitter::DoGetConstraintSize(PointT& size) const {
     if (LayoutManagerElement* b = CountedSecond()) {
         b->GetConstraintSize(cb);
     }
-    size = Combine(ca, cb);
+    cachedConstraint_ = Combine(ca, cb);
+    size = cachedConstraint_;
 }
 
 bool Splitter::DoGetIsStretchy(bool inHeight) const {
+    if (CachedReport(stretchyStamp_[inHeight], true)) {
+        return cachedStretchy_[inHeight];
+    }
     LayoutManagerElement* a = CountedFirst();
     LayoutManagerElement* b = CountedSecond();
-    return (a && a->IsStretchy(inHeight)) || (b && b->IsStretchy(inHeight));
+    cachedStretchy_[inHeight] = (a && a->IsStretchy(inHeight)) || (b && b->IsStretchy(inHeight));
+    return cachedStretchy_[inHeight];
 }
 
 void Splitter::DoGetSnapSizes(std::vector<PointT>& sizes) const {

@@ -104,6 +104,15 @@ private:
         return IsRightOrBottomSubtreeVisible() ? rightOrBottom_ : nullptr;
     }
 
+    // The subtree's reports remembered for the layout's current report pass (see LayoutManager).
+    bool CachedReport(unsigned long& stamp, bool fitOnly) const;
+    mutable unsigned long minimumStamp_ = 0;
+    mutable unsigned long constraintStamp_ = 0;
+    mutable unsigned long stretchyStamp_[2] = {0, 0};
+    mutable PointT cachedMinimum_;
+    mutable PointT cachedConstraint_;
+    mutable bool cachedStretchy_[2] = {false, false};
+
     float prevPlacement_ = 0.5f;
     RectT prevLocation_;
     float placement_ = 0.5f;

@@ -194,3 +194,32 @@ TEST(LayoutProperty, RandomEditsKeepTheTreeWellFormedAndTheWindowTiled) {
         }
     }
 }
+
+TEST(LayoutProperty, RememberingSubtreeReportsChangesNoResult) {
+    // The same random runs with and without the per-pass memory of subtree reports must place every
+    // frame identically after every step.
+    auto run = [](unsigned seed, bool remember) {
+        LayoutManager::SetReportCacheEnabled(remember);
+        RandomLayout layout(seed);
+        layout.layout->SetContainingRect(RectT(0, 0, 1000, 700));
+        std::vector<std::string> trace;
+        for (int step = 0; step < 60; ++step) {
+            std::string line = layout.Step() + " ->";
+            for (auto const& host : layout.hosts) {
+                RectT r = host->Rect();
+                line += " " + std::to_string(r.left) + "," + std::to_string(r.top) + "," +
+                        std::to_string(r.width) + "," + std::to_string(r.height);
+            }
+            trace.push_back(line + " | " + layout.Dump());
+        }
+        LayoutManager::SetReportCacheEnabled(true);
+        return trace;
+    };
+    for (unsigned seed = 1; seed <= 100; ++seed) {
+        std::vector<std::string> plain = run(seed, false);
+        std::vector<std::string> remembered = run(seed, true);
+        for (std::size_t i = 0; i < plain.size(); ++i) {
+            ASSERT_EQ(plain[i], remembered[i]) << "seed " << seed << ", step " << i;
+        }
+    }
+}
