@@ -111,6 +111,18 @@ void BM_RelayoutChain(benchmark::State& state) {
     Relayout(state, true);
 }
 
+// One what-if add beside a frame in the middle of a balanced layout of 256 frames.
+void BM_PreviewAddFrame(benchmark::State& state) {
+    BenchLayout bench(256, false);
+    auto* target = static_cast<Frame*>(bench.frames[128].get());
+    NullFrameHost newHost;
+    Frame newFrame(nullptr, &newHost);
+    for (auto _ : state) {
+        benchmark::DoNotOptimize(bench.layout->PreviewAddFrame(target, LayoutManager::Right, &newFrame));
+    }
+}
+BENCHMARK(BM_PreviewAddFrame)->Repetitions(5)->ReportAggregatesOnly(true)->Unit(benchmark::kMicrosecond);
+
 BENCHMARK(BM_RelayoutBalanced)
     ->RangeMultiplier(4)
     ->Range(16, 1024)
@@ -158,6 +170,8 @@ int main(int argc, char** argv) {
     }
     std::printf("balanced(1024): %.1f ns per frame (target at most 150)\n",
                 reporter.seconds["BM_RelayoutBalanced/1024"] * 1e9 / 1024);
+    std::printf("PreviewAddFrame over 256 frames: %.1f us (target under 200)\n",
+                reporter.seconds["BM_PreviewAddFrame/"] * 1e6);
     benchmark::Shutdown();
     return 0;
 }

@@ -88,6 +88,16 @@ public:
     // LayoutNewFrame. Nothing happens when proxy is not one of this layout's placeholders.
     void ReanimateFrame(LayoutManagerElement* proxy, Frame* f);
 
+    // --- Previews ---
+
+    // The rectangle newFrame would get from AddFrame(target, side, newFrame), worked out on a copy
+    // of the tree; the real frames are neither placed nor asked to show. Empty when target has no
+    // copy (it is not in this tree).
+    RectT PreviewAddFrame(Frame* target, InsertionType side, Frame* newFrame);
+    // The rectangle `other` (by default f's sibling, when that is a frame) would get once f is
+    // removed, worked out on a copy. Empty when there is no such frame.
+    RectT PreviewRemoveFrame(Frame* f, Frame* other) const;
+
     // --- Settings ---
 
     void SetBorderSize(long size) { borderSize_ = size; }
@@ -157,6 +167,10 @@ protected:
     LayoutManagerElement* GetRoot() const;
 
 private:
+    // A second layout over an already built tree (a preview's copy), with this one's sizes.
+    LayoutManager(LayoutManager const& source, LayoutManagerHostInterface* host, Splitter* root,
+                  RectT const& rect);
+
     // Opens a report pass of a kind for its lifetime, unless one of that kind is already open.
     class ReportPassScope {
     public:

@@ -33,7 +33,7 @@ public:
     // One random step; returns its description for the failure message.
     std::string Step() {
         std::vector<Frame*> inTree = InTree();
-        switch (Pick(9)) {
+        switch (Pick(10)) {
         case 0:
         case 1: {
             Frame* target = inTree.empty() || Pick(5) == 0 ? nullptr : inTree[Pick(int(inTree.size()))];
@@ -113,6 +113,32 @@ public:
             layout->ReLayout(Coin(), true, false);
             return "Toggle " + Host(f).name;
         }
+        case 8: {
+            // Previews must leave the tree and every real host as they were.
+            if (inTree.empty()) {
+                return "nothing to preview";
+            }
+            std::string dump = Dump();
+            std::vector<std::pair<int, int>> calls;
+            for (auto const& h : hosts) {
+                calls.emplace_back(h->placements, h->showCalls);
+            }
+            Frame* f = inTree[Pick(int(inTree.size()))];
+            Frame* n = MakeFrame();
+            layout->PreviewAddFrame(Coin() ? f : nullptr, static_cast<LayoutManager::InsertionType>(Pick(4)),
+                                    n);
+            layout->PreviewRemoveFrame(f, Coin() ? inTree[Pick(int(inTree.size()))] : nullptr);
+            calls.emplace_back(0, 0); // the new frame's host
+            for (std::size_t i = 0; i < hosts.size(); ++i) {
+                if (calls[i] != std::make_pair(hosts[i]->placements, hosts[i]->showCalls)) {
+                    previewProblem = "a preview touched the real frame " + hosts[i]->name;
+                }
+            }
+            if (Dump() != dump) {
+                previewProblem = "a preview changed the real tree";
+            }
+            return "Preview around " + Host(f).name;
+        }
         default: {
             RectT r(Pick(50), Pick(50), 400 + Pick(1200), 300 + Pick(900));
             bool distribute = Coin(), keep = Pick(4) == 0;
@@ -125,6 +151,9 @@ public:
 
     // The rectangles that must tile the window: placed static frames and shown frames of the tree.
     std::string TilingProblem() {
+        if (!previewProblem.empty()) {
+            return previewProblem;
+        }
         RectT bounds = layout->GetContainingRect();
         std::vector<RectT> pieces;
         bool secondTop = layout->GetEnableLeftStaticBorderAsSecondTopFrame();
@@ -167,6 +196,7 @@ public:
 
     std::mt19937 rng;
     std::vector<Frame*> remembered;
+    std::string previewProblem;
 };
 
 } // namespace
