@@ -395,3 +395,46 @@ TEST_F(LayoutTree, DumpDescribesEveryNode) {
                       "3 [shape=box,style=dashed,label=\"Placeholder\"];\n"
                       "}");
 }
+
+TEST_F(LayoutTree, ReanimationReopensAFullyHiddenBranch) {
+    Frame* a = NewFrame("a");
+    layout->SetRootFrame(a, window800);
+    Frame* b = NewFrame("b");
+    Frame* c = NewFrame("c");
+    layout->AddFrame(a, LayoutManager::Right, b);
+    layout->AddFrame(b, LayoutManager::Bottom, c);
+    layout->RemoveFrame(b, true, true);
+    layout->RemoveFrame(c, true, true);
+    EXPECT_EQ(Shape(), "V(a,H(_,_))");
+    EXPECT_EQ(RectOf(a), window800);
+    Splitter* rows = layout->FindFrameForReanimation(b)->GetParent();
+    Splitter* columns = rows->GetParent();
+    EXPECT_FALSE(columns->GetRightOrBottomVisibleFlag());
+
+    layout->ReanimateFrame(layout->FindFrameForReanimation(b), b);
+    EXPECT_TRUE(rows->GetLeftOrTopVisibleFlag());
+    EXPECT_FALSE(rows->GetRightOrBottomVisibleFlag()); // c's slot stays closed
+    EXPECT_TRUE(columns->IsVisible());                 // the way up is open again
+    layout->LayoutNewFrame(b);
+    EXPECT_EQ(Shape(), "V(a,H(b,_))");
+    EXPECT_EQ(RectOf(b), RectT(400, 0, 400, 600));
+    EXPECT_EQ(RectOf(a), RectT(0, 0, 400, 600));
+    EXPECT_EQ(layout->StructureProblem(true), "");
+}
+
+TEST_F(LayoutTree, TheFirstMadePlaceholderOfATabTypeWins) {
+    Frame* a = NewFrame("a");
+    layout->SetRootFrame(a, window800);
+    Frame* b = NewFrame("b");
+    Frame* c = NewFrame("c");
+    layout->AddFrame(a, LayoutManager::Right, b);
+    layout->AddFrame(a, LayoutManager::Bottom, c);
+    Host(c).first = {{"media", "older"}};
+    Host(b).first = {{"media", "newer"}};
+    layout->RemoveFrame(c, true, false);
+    layout->RemoveFrame(b, true, false);
+    FrameDataProxy* found = layout->FindFrameForReanimation(std::string("media"));
+    ASSERT_NE(found, nullptr);
+    EXPECT_EQ(found->GetTabData(), (TabDataList{{"media", "older"}}));
+    EXPECT_EQ(layout->FindFrameForReanimation(std::string("med")), nullptr); // whole types only
+}
