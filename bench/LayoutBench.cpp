@@ -1,30 +1,20 @@
 // Relayout (a window resize) of balanced trees and of degenerate chains of 16 to 1024 frames, with
 // hosts that do nothing. Prints nanoseconds per frame (medians of five repetitions), and how chain
 // relayout grows from 256 to 1024 frames (linear growth is 4).
+#include "MedianCollector.h"
 #include "layout/Frame.h"
 #include "layout/LayoutManager.h"
-#include "layout/LayoutManagerHostInterface.h"
+#include "layout/ProxyMgrHostInterface.h"
 #include "layout/Splitter.h"
 
 #include <benchmark/benchmark.h>
 #include <cstdio>
 #include <deque>
-#include <map>
 #include <memory>
 
 using namespace orvworkspace::workspace;
 
 namespace {
-
-class NullWindow : public LayoutManagerHostInterface {
-public:
-    void SuspendRedraws(bool) override {}
-    void UpdateNow() override {}
-    bool GetSplitterSnappingEnabled() override { return true; }
-    bool GetLayoutEnabled() override { return true; }
-    long GetTabMinHeight() override { return 0; }
-    long GetTabMinWidth() override { return 0; }
-};
 
 class NullFrameHost : public FrameHostInterface {
 public:
@@ -86,7 +76,7 @@ public:
         return tail;
     }
 
-    NullWindow window;
+    ProxyMgrHostInterface window; // layout on, nothing else
     std::deque<std::unique_ptr<NullFrameHost>> hosts;
     std::deque<std::unique_ptr<Frame>> frames;
     std::unique_ptr<LayoutManager> layout;
@@ -130,48 +120,30 @@ BENCHMARK(BM_RelayoutBalanced)
     ->ReportAggregatesOnly(true);
 BENCHMARK(BM_RelayoutChain)->RangeMultiplier(4)->Range(16, 1024)->Repetitions(5)->ReportAggregatesOnly(true);
 
-// Keeps the median time per iteration of each run so the summary can print per-frame figures.
-class MedianCollector : public benchmark::ConsoleReporter {
-public:
-    void ReportRuns(std::vector<Run> const& runs) override {
-        for (Run const& run : runs) {
-            if (run.run_type == Run::RT_Aggregate && run.aggregate_name == "median") {
-                seconds[run.run_name.function_name + "/" + run.run_name.args] =
-                    run.GetAdjustedRealTime() / benchmark::GetTimeUnitMultiplier(run.time_unit);
-            }
-        }
-        ConsoleReporter::ReportRuns(runs);
-    }
-    std::map<std::string, double> seconds;
-};
-
 } // namespace
 
 int main(int argc, char** argv) {
     benchmark::Initialize(&argc, argv);
-    MedianCollector reporter;
+    orvbench::MedianCollector reporter;
     benchmark::RunSpecifiedBenchmarks(&reporter);
     std::printf("\nrelayout, nanoseconds per frame (median):\n");
     for (char const* kind : {"BM_RelayoutBalanced", "BM_RelayoutChain"}) {
         std::printf("%-20s", kind + 3);
         for (int n : {16, 64, 256, 1024}) {
-            auto it = reporter.seconds.find(std::string(kind) + "/" + std::to_string(n));
-            std::printf("  %5d: %8.1f", n, it == reporter.seconds.end() ? 0.0 : it->second * 1e9 / n);
+            std::printf("  %5d: %8.1f", n,
+                        reporter.Seconds(std::string(kind) + "/" + std::to_string(n)) * 1e9 / n);
         }
         std::printf("\n");
     }
-    auto chain = [&](int n) {
-        auto it = reporter.seconds.find("BM_RelayoutChain/" + std::to_string(n));
-        return it == reporter.seconds.end() ? 0.0 : it->second;
-    };
+    auto chain = [&](int n) { return reporter.Seconds("BM_RelayoutChain/" + std::to_string(n)); };
     if (chain(256) > 0) {
         std::printf("chain(1024) / chain(256): %.2f (target at most 5; linear is 4)\n",
                     chain(1024) / chain(256));
     }
     std::printf("balanced(1024): %.1f ns per frame (target at most 150)\n",
-                reporter.seconds["BM_RelayoutBalanced/1024"] * 1e9 / 1024);
+                reporter.Seconds("BM_RelayoutBalanced/1024") * 1e9 / 1024);
     std::printf("PreviewAddFrame over 256 frames: %.1f us (target under 200)\n",
-                reporter.seconds["BM_PreviewAddFrame/"] * 1e6);
+                reporter.Seconds("BM_PreviewAddFrame/") * 1e6);
     benchmark::Shutdown();
     return 0;
 }

@@ -1,11 +1,11 @@
 // Writing and reading a 1 MB property-list document shaped like a large saved workspace, against
 // pugixml's own parse of the same bytes. Prints MB/s of each (medians of five repetitions) and the
 // ratio of our read to pugixml's parse.
+#include "MedianCollector.h"
 #include "host/core/PropListUtils.h"
 
 #include <benchmark/benchmark.h>
 #include <cstdio>
-#include <map>
 #include <pugixml.hpp>
 
 using orvcore::proplist::PropList;
@@ -93,32 +93,16 @@ BENCHMARK(BM_Write)->Repetitions(5)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_Read)->Repetitions(5)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_PugixmlParse)->Repetitions(5)->Unit(benchmark::kMillisecond);
 
-// Keeps the median time per iteration of each benchmark so the summary can print rates and ratios
-// from this very run.
-class MedianCollector : public benchmark::ConsoleReporter {
-public:
-    void ReportRuns(std::vector<Run> const& runs) override {
-        for (Run const& run : runs) {
-            if (run.run_type == Run::RT_Aggregate && run.aggregate_name == "median") {
-                seconds[run.run_name.function_name] =
-                    run.GetAdjustedRealTime() / benchmark::GetTimeUnitMultiplier(run.time_unit);
-            }
-        }
-        ConsoleReporter::ReportRuns(runs);
-    }
-    std::map<std::string, double> seconds;
-};
-
 } // namespace
 
 int main(int argc, char** argv) {
     benchmark::Initialize(&argc, argv);
-    MedianCollector reporter;
+    orvbench::MedianCollector reporter;
     benchmark::RunSpecifiedBenchmarks(&reporter);
     double megabytes = double(Document().size()) / (1024.0 * 1024.0);
     auto rate = [&](char const* name) {
-        auto it = reporter.seconds.find(name);
-        return it == reporter.seconds.end() || it->second <= 0 ? 0.0 : megabytes / it->second;
+        double seconds = reporter.Seconds(std::string(name) + "/");
+        return seconds <= 0 ? 0.0 : megabytes / seconds;
     };
     double write = rate("BM_Write"), read = rate("BM_Read"), pugi = rate("BM_PugixmlParse");
     std::printf("\ndocument: %zu bytes\n", Document().size());

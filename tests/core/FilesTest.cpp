@@ -5,13 +5,12 @@
 #include "host/core/ErrorTable.h"
 #include "host/core/File.h"
 #include "host/core/FileUtils.h"
+#include "support/FileSizeLimit.h"
 #include "support/TempDir.h"
 
-#include <csignal>
 #include <cstdlib>
 #include <fcntl.h>
 #include <gtest/gtest.h>
-#include <sys/resource.h>
 #include <sys/stat.h>
 
 using orvcore::filesupport::Dir;
@@ -193,21 +192,14 @@ TEST(FileUtils, ReadWholeFileRefusesOversizedAndMissingFiles) {
 TEST(FileUtils, FailedWriteLeavesThePreviousFileWhole) {
     TempDir tmp;
     fs::path target = tmp.Write("doc.xml", "the previous document");
-    // Limit the size of files this process may write, so the write fails half-way as on a full disk.
-    struct rlimit old {};
-    ASSERT_EQ(::getrlimit(RLIMIT_FSIZE, &old), 0);
-    auto oldHandler = std::signal(SIGXFSZ, SIG_IGN);
-    struct rlimit small = old;
-    small.rlim_cur = 1000;
-    ASSERT_EQ(::setrlimit(RLIMIT_FSIZE, &small), 0);
     bool raised = false;
-    try {
-        FileUtils::WriteFileAtomically(TempDir::PathU16(target), std::string(5000, 'x'));
-    } catch (orvcore::config::Error const& e) {
-        raised = e.Code() == 22 && e.Facility() == 110;
-    }
-    ::setrlimit(RLIMIT_FSIZE, &old);
-    std::signal(SIGXFSZ, oldHandler);
+    ASSERT_TRUE(orvtest::WithFileSizeLimit(1000, [&] {
+        try {
+            FileUtils::WriteFileAtomically(TempDir::PathU16(target), std::string(5000, 'x'));
+        } catch (orvcore::config::Error const& e) {
+            raised = e.Code() == 22 && e.Facility() == 110;
+        }
+    }));
     EXPECT_TRUE(raised);
     EXPECT_EQ(orvtest::ReadFile(target), "the previous document");
     EXPECT_EQ(std::distance(fs::directory_iterator(tmp.Path()), fs::directory_iterator()), 1)

@@ -3,15 +3,14 @@
 #include "host/core/Error.h"
 #include "host/core/ErrorTable.h"
 #include "host/core/PropListUtils.h"
+#include "support/FileSizeLimit.h"
 #include "support/TempDir.h"
 
 #include <algorithm>
 #include <cfloat>
 #include <climits>
 #include <cmath>
-#include <csignal>
 #include <gtest/gtest.h>
-#include <sys/resource.h>
 
 using orvcore::config::Error;
 using orvcore::proplist::PropList;
@@ -368,20 +367,14 @@ TEST(PropListDocument, FailedSaveKeepsThePreviousDocument) {
     SavePropList(tmp.U16("doc.xml"), small);
     PropList big;
     big.SetValue("text", std::string(100000, 'x'));
-    struct rlimit old {};
-    ASSERT_EQ(::getrlimit(RLIMIT_FSIZE, &old), 0);
-    auto oldHandler = std::signal(SIGXFSZ, SIG_IGN);
-    struct rlimit limited = old;
-    limited.rlim_cur = 4096;
-    ASSERT_EQ(::setrlimit(RLIMIT_FSIZE, &limited), 0);
     bool raised = false;
-    try {
-        SavePropList(tmp.U16("doc.xml"), big);
-    } catch (Error const&) {
-        raised = true;
-    }
-    ::setrlimit(RLIMIT_FSIZE, &old);
-    std::signal(SIGXFSZ, oldHandler);
+    ASSERT_TRUE(orvtest::WithFileSizeLimit(4096, [&] {
+        try {
+            SavePropList(tmp.U16("doc.xml"), big);
+        } catch (Error const&) {
+            raised = true;
+        }
+    }));
     EXPECT_TRUE(raised);
     PropList back;
     ASSERT_TRUE(LoadPropList(tmp.U16("doc.xml"), back, true));
