@@ -101,6 +101,24 @@ void BM_RelayoutChain(benchmark::State& state) {
     Relayout(state, true);
 }
 
+// One move of the main bar of a balanced layout of 256 frames during a drag, snapping on.
+void BM_TrackMove(benchmark::State& state) {
+    BenchLayout bench(256, false);
+    bench.layout->SetUserAdjustingSplitter(true);
+    RectT bar = bench.layout->GetSplitters().front()->GetDrawRect();
+    PointT press(bar.left + bar.width / 2, bar.top + bar.height / 2);
+    orvcore::utility::ScopedPtr<LayoutManager::Tracker> tracker;
+    bench.layout->AcquireTracker(press.x, press.y, tracker);
+    tracker->TrackBegin(press);
+    int step = 0;
+    for (auto _ : state) {
+        step = (step + 1) % 64;
+        tracker->TrackMove(PointT(press.x - 32 + step, press.y));
+    }
+    tracker->TrackEnd();
+}
+BENCHMARK(BM_TrackMove)->Repetitions(5)->ReportAggregatesOnly(true)->Unit(benchmark::kMicrosecond);
+
 // One what-if add beside a frame in the middle of a balanced layout of 256 frames.
 void BM_PreviewAddFrame(benchmark::State& state) {
     BenchLayout bench(256, false);
@@ -142,6 +160,8 @@ int main(int argc, char** argv) {
     }
     std::printf("balanced(1024): %.1f ns per frame (target at most 150)\n",
                 reporter.Seconds("BM_RelayoutBalanced/1024") * 1e9 / 1024);
+    std::printf("TrackMove over 256 frames: %.1f us (target under 100)\n",
+                reporter.Seconds("BM_TrackMove/") * 1e6);
     std::printf("PreviewAddFrame over 256 frames: %.1f us (target under 200)\n",
                 reporter.Seconds("BM_PreviewAddFrame/") * 1e6);
     benchmark::Shutdown();

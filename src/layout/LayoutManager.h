@@ -8,19 +8,23 @@
 // empty rectangle.
 #pragma once
 
+#include "host/core/ScopedPtr.h"
 #include "layout/FrameZones.h"
 #include "layout/LayoutTypes.h"
 
 #include <iosfwd>
 #include <list>
 #include <map>
+#include <memory>
 #include <string>
 #include <vector>
 
 namespace orvworkspace::workspace {
 
+class DropZone;
 class Frame;
 class FrameDataProxy;
+struct SnapPoint;
 class LayoutManagerElement;
 class LayoutManagerHostInterface;
 class Splitter;
@@ -31,6 +35,15 @@ public:
     enum InsertionType { Top = 0, Left = 1, Bottom = 2, Right = 3 };
     // What lies under a point: no bar, one bar of either orientation, or a crossing of bars.
     enum CursorType { NoSplitter = 0, VerticalSplitter = 1, HorizontalSplitter = 2, SplitterCrossing = 3 };
+
+    // Moves bars under the mouse during a splitter drag; points are in layout coordinates.
+    class Tracker {
+    public:
+        virtual ~Tracker() = default;
+        virtual void TrackBegin(PointT const& point) = 0;
+        virtual void TrackMove(PointT const& point) = 0;
+        virtual void TrackEnd() = 0;
+    };
 
     explicit LayoutManager(LayoutManagerHostInterface* host);
     ~LayoutManager();
@@ -97,6 +110,19 @@ public:
     // The rectangle `other` (by default f's sibling, when that is a frame) would get once f is
     // removed, worked out on a copy. Empty when there is no such frame.
     RectT PreviewRemoveFrame(Frame* f, Frame* other) const;
+
+    // --- Dragging ---
+
+    // The six drop regions of frame when its rectangle is rect: side bands, centre and tab row, in
+    // that order. exclusions holds four insets by InsertionType taken by the window's edge regions.
+    std::vector<DropZone> GetDropZones(Frame* frame, RectT const& rect, std::vector<long> const& exclusions);
+    // A tracker for the bars under (x, y), each majorized first; out stays empty when no bar is there
+    // (always while a frame is maximised). Whatever out held before is deleted.
+    void AcquireTracker(long x, long y, orvcore::utility::ScopedPtr<Tracker>& out);
+    // Appends the positions of the visible bars of the given orientation that a chain walk from the
+    // root splitter meets, skipping the excluded ones; from and to are not consulted.
+    void FindAdjacentSnapPoints(Splitter* dragged, bool vertical, long from, long to,
+                                std::vector<Splitter*> const& excluded, std::vector<SnapPoint*>& out);
 
     // --- Settings ---
 
@@ -167,6 +193,11 @@ protected:
     LayoutManagerElement* GetRoot() const;
 
 private:
+    friend class SplitterTrackerMark2;
+
+    void DoFindAdjacentSnapPoints(Splitter* dragged, Splitter* start, bool vertical,
+                                  std::vector<Splitter*> const& excluded, std::vector<SnapPoint*>& out);
+
     // A second layout over an already built tree (a preview's copy), with this one's sizes.
     LayoutManager(LayoutManager const& source, LayoutManagerHostInterface* host, Splitter* root,
                   RectT const& rect);

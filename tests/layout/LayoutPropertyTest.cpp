@@ -33,7 +33,7 @@ public:
     // One random step; returns its description for the failure message.
     std::string Step() {
         std::vector<Frame*> inTree = InTree();
-        switch (Pick(10)) {
+        switch (Pick(11)) {
         case 0:
         case 1: {
             Frame* target = inTree.empty() || Pick(5) == 0 ? nullptr : inTree[Pick(int(inTree.size()))];
@@ -138,6 +138,29 @@ public:
                 previewProblem = "a preview changed the real tree";
             }
             return "Preview around " + Host(f).name;
+        }
+        case 9: {
+            // A user's drag of a bar (or a crossing), as the splitter dragger runs it.
+            std::vector<Splitter*> bars = layout->GetSplitters();
+            if (bars.empty()) {
+                return "no bar to drag";
+            }
+            RectT bar = bars[std::size_t(Pick(int(bars.size())))]->GetDrawRect();
+            PointT press(bar.left + bar.width / 2, bar.top + bar.height / 2);
+            orvcore::utility::ScopedPtr<LayoutManager::Tracker> tracker;
+            layout->AcquireTracker(press.x, press.y, tracker);
+            if (!tracker) {
+                return "no tracker";
+            }
+            layout->SetUserAdjustingSplitter(true);
+            tracker->TrackBegin(press);
+            RectT area = layout->GetContainingRect();
+            for (int move = 0; move < 3; ++move) {
+                tracker->TrackMove(PointT(area.left + Pick(area.width), area.top + Pick(area.height)));
+            }
+            tracker->TrackEnd();
+            layout->SetUserAdjustingSplitter(false);
+            return "Drag bar at " + std::to_string(press.x) + "," + std::to_string(press.y);
         }
         default: {
             RectT r(Pick(50), Pick(50), 400 + Pick(1200), 300 + Pick(900));
