@@ -257,9 +257,14 @@ void LayoutManager::SwapRoot(Splitter* newRoot) {
             reanimatableProxies_.push_back(proxy);
         }
     });
-    // A maximised frame of the old tree is no longer this layout's to place.
+    // Frames hidden by a maximise that did not come along are no longer this layout's to show; if
+    // the maximised frame itself did not come along, the ones that did are shown again.
+    framesHiddenByMaximize_.remove_if([&](Frame* f) { return !IsInTree(f); });
     if (maximizedFrame_ && !IsInTree(maximizedFrame_)) {
         maximizedFrame_ = nullptr;
+        for (Frame* hidden : framesHiddenByMaximize_) {
+            hidden->ShowFrame(true);
+        }
         framesHiddenByMaximize_.clear();
     }
 }

@@ -247,8 +247,10 @@ private:
     Frame* maximizedFrame_ = nullptr;
     std::list<Frame*> framesHiddenByMaximize_;
     static inline bool reportCacheEnabled = true;
+    // Pass numbers are unique in the process, so a splitter moved between layouts (a restored tree
+    // swapped in) can never mistake an old stamp for the current pass.
+    static inline unsigned long lastReportPass_ = 0;
     unsigned long reportPass_ = 0;
-    unsigned long lastReportPass_ = 0;
     ReportPassKind reportPassKind_ = ReportPassKind::None;
 };
 

@@ -48,6 +48,9 @@ public:
     void ShowFrame(bool show) override {
         shown = show;
         ++showCalls;
+        if (showLog) {
+            showLog->push_back(name + (show ? "+" : "-"));
+        }
     }
     bool IsFrameShown() const override { return shown; }
     PointT GetMinimumSize() const override { return minimum; }
@@ -77,6 +80,7 @@ public:
     FrameZones zones;
     int placements = 0;
     int showCalls = 0;
+    std::vector<std::string>* showLog = nullptr;
     TabDataList first, second, third;
 };
 

@@ -147,13 +147,21 @@ TEST_F(LayoutDrag, SnappingSwitchedOffTriesNoCandidateAndKeepsInnerBars) {
     layout->SetRootFrame(a, RectT(0, 0, 800, 600));
     layout->AddFrame(a, LayoutManager::Right, b);
     layout->AddFrame(b, LayoutManager::Bottom, c);
+    Frame* d = NewFrame("d");
+    layout->AddFrame(a, LayoutManager::Bottom, d);
     Host(b).snaps = {PointT(300, 0)};
+    Host(a).snaps = {PointT(0, 250)};
+    Host(d).snaps = {PointT(0, 250)};
+    Host(b).snaps = {PointT(300, 0), PointT(0, 200)};
+    Host(c).snaps = {PointT(0, 200)};
+    layout->ReLayout(false, true, false);
     window.snapping = false;
-    long rowBar = RectOf(c).top;
+    long rightRows = RectOf(c).top, leftRows = RectOf(d).top;
     Drag(PointT(std::int32_t(RectOf(b).left), 100));
     tracker->TrackMove(PointT(519, 100));
     EXPECT_EQ(RectOf(b).left, 519);
-    EXPECT_EQ(RectOf(c).top, rowBar); // the inner bar kept its absolute position
+    EXPECT_EQ(RectOf(c).top, rightRows); // inner bars on both sides kept their absolute positions
+    EXPECT_EQ(RectOf(d).top, leftRows);
 }
 
 TEST_F(LayoutDrag, CrossingDragsBothAxesAndSharesASnap) {

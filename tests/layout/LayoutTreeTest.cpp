@@ -117,6 +117,52 @@ TEST_F(LayoutTree, RememberedFrameIsFoundByIdentity) {
     layout->LayoutNewFrame(b);
     EXPECT_EQ(Shape(), "H(a,b)");
     EXPECT_EQ(RectOf(b), RectT(0, 300, 800, 300));
+    EXPECT_FALSE(layout->HasAnyReanimatableFrames());
+    EXPECT_EQ(layout->StructureProblem(true), "");
+}
+
+TEST_F(LayoutTree, PlaceholderWithoutTheFrameIsFoundByAnyFormerTabType) {
+    Frame* a = NewFrame("a");
+    layout->SetRootFrame(a, window800);
+    Frame* b = NewFrame("b");
+    layout->AddFrame(a, LayoutManager::Right, b);
+    Host(b).first = {{"first", ""}};
+    Host(b).second = {{"second", ""}};
+    Host(b).third = {{"third", ""}};
+    layout->RemoveFrame(b, true, false);
+    FrameDataProxy* proxy = layout->FindFrameForReanimation(std::string("first"));
+    ASSERT_NE(proxy, nullptr);
+    EXPECT_EQ(layout->FindFrameForReanimation(std::string("second")), proxy);
+    EXPECT_EQ(layout->FindFrameForReanimation(std::string("third")), proxy);
+    EXPECT_EQ(layout->FindFrameForReanimation(b), nullptr);
+}
+
+TEST_F(LayoutTree, ANewSplitterStartsInTheMiddle) {
+    Frame* a = NewFrame("a");
+    layout->SetRootFrame(a, window800);
+    Frame* b = NewFrame("b");
+    layout->AddFrame(a, LayoutManager::Bottom, b);
+    EXPECT_FLOAT_EQ(a->GetParent()->GetStoredPlacement(), 0.5f);
+    EXPECT_FALSE(a->GetParent()->IsVertical());
+}
+
+TEST_F(LayoutTree, SwappingTheTreeWhileMaximisedLosesNoFrame) {
+    Frame* a = NewFrame("a");
+    layout->SetRootFrame(a, window800);
+    Frame* b = NewFrame("b");
+    layout->AddFrame(a, LayoutManager::Right, b);
+    layout->SetMaximizedFrame(a);
+    ASSERT_FALSE(Host(b).shown);
+    // A new tree holding b but not a: b must not stay hidden for good.
+    auto* root = new Splitter(layout.get(), false);
+    b->GetParent()->ReplaceElement(b, nullptr);
+    root->SetLeftOrTop(b);
+    b->SetParent(root);
+    layout->SwapRoot(root);
+    EXPECT_FALSE(layout->HasMaximizedFrame());
+    EXPECT_TRUE(Host(b).shown);
+    layout->ReLayout(false, true, false);
+    EXPECT_EQ(RectOf(b), window800);
 }
 
 TEST_F(LayoutTree, SetRootFrameOverAHiddenTreeStacksAboveIt) {
@@ -163,9 +209,10 @@ TEST_F(LayoutTree, MaximiseHidesOthersAndRestoreShowsThemInOrder) {
 
     std::vector<std::string> shownOrder;
     for (auto& h : hosts) {
-        h->showCalls = 0;
+        h->showLog = &shownOrder;
     }
     layout->SetMaximizedFrame(nullptr);
+    EXPECT_EQ(shownOrder, (std::vector<std::string>{"a+", "c+"})); // left to right, as they were hidden
     EXPECT_TRUE(Host(a).shown);
     EXPECT_TRUE(Host(c).shown);
     EXPECT_FALSE(Host(d).shown); // stays hidden

@@ -1,0 +1,270 @@
+// Focus, captures and the routing of input to nodes.
+#include "host/ui/NodeManager.h"
+
+#include "host/ui/Desktop.h"
+#include "host/ui/OS_Window.h"
+
+#include <algorithm>
+
+namespace orvui::ui {
+
+namespace {
+
+UI_NodeManager* current = nullptr;
+
+class DefaultNodeManager : public OS_NodeManager {};
+
+// The node and its ancestors, nearest first, as owning pointers so notifications cannot free them.
+std::vector<boost::intrusive_ptr<UI_Node>> Chain(UI_Node* node) {
+    std::vector<boost::intrusive_ptr<UI_Node>> chain;
+    for (UI_Node* n = node; n; n = n->UI_GetParentNode()) {
+        chain.emplace_back(n);
+    }
+    return chain;
+}
+
+} // namespace
+
+UI_NodeManager* UI_NodeManager::Get() {
+    if (!current) {
+        static DefaultNodeManager fallback;
+        return &fallback;
+    }
+    return current;
+}
+
+UI_NodeManager::UI_NodeManager()
+    : previous_(current) {
+    current = this;
+}
+
+UI_NodeManager::~UI_NodeManager() {
+    if (current == this) {
+        current = previous_;
+    }
+}
+
+void UI_NodeManager::NotifyUserResize(bool begin, UI_Node* node, bool resize) {
+    if (userResize_) {
+        userResize_(begin, node, resize);
+    }
+}
+
+UI_NodeManager::SuspendMouseOverUpdates::SuspendMouseOverUpdates() {
+    ++Get()->mouseOverSuspended_;
+}
+UI_NodeManager::SuspendMouseOverUpdates::~SuspendMouseOverUpdates() {
+    --Get()->mouseOverSuspended_;
+}
+
+UI_NodeManager::NotifyUserResizing::NotifyUserResizing(UI_Node* node, bool resize)
+    : node_(node)
+    , resize_(resize) {
+    Get()->NotifyUserResize(true, node_, resize_);
+}
+UI_NodeManager::NotifyUserResizing::~NotifyUserResizing() {
+    Get()->NotifyUserResize(false, node_, resize_);
+}
+
+UI_NodeManager::GroupingFocusChanges::GroupingFocusChanges() {
+    UI_NodeManager* m = Get();
+    if (m->grouping_++ == 0) {
+        m->focusAtGroupStart_ = m->focus_;
+        m->groupReason_ = FocusUnknown;
+    }
+}
+
+UI_NodeManager::GroupingFocusChanges::~GroupingFocusChanges() {
+    UI_NodeManager* m = Get();
+    if (--m->grouping_ == 0) {
+        m->Notify(m->focusAtGroupStart_, m->focus_, m->groupReason_);
+        m->focusAtGroupStart_ = nullptr;
+    }
+}
+
+void UI_NodeManager::BeginInputCapture(std::shared_ptr<InputCapture> capture) {
+    std::shared_ptr<InputCapture> previous = std::move(inputCapture_);
+    inputCapture_ = std::move(capture);
+    if (previous) {
+        previous->CaptureEnded();
+    }
+}
+
+void UI_NodeManager::EndInputCapture(InputCapture const* capture) {
+    if (inputCapture_ && inputCapture_.get() == capture) {
+        std::shared_ptr<InputCapture> ended = std::move(inputCapture_);
+        ended->CaptureEnded();
+    }
+}
+
+void UI_NodeManager::SetFocusLeaf(UI_Node* node, int reason) {
+    if (node == focus_) {
+        return;
+    }
+    UI_Node* previous = focus_;
+    focus_ = node;
+    if (grouping_ > 0) {
+        groupReason_ = reason;
+        return;
+    }
+    Notify(previous, node, reason);
+}
+
+void UI_NodeManager::Notify(UI_Node* from, UI_Node* to, int reason) {
+    if (from == to) {
+        return;
+    }
+    auto lost = Chain(from);
+    auto gained = Chain(to);
+    auto contains = [](std::vector<boost::intrusive_ptr<UI_Node>> const& chain, UI_Node* n) {
+        return std::any_of(chain.begin(), chain.end(), [&](auto const& p) { return p.get() == n; });
+    };
+    ++updatingFocus_;
+    for (auto const& n : lost) {
+        if (!contains(gained, n.get())) {
+            n->UI_FocusChanged(reason);
+        }
+    }
+    for (auto const& n : gained) {
+        if (!contains(lost, n.get())) {
+            n->UI_FocusChanged(reason);
+        }
+    }
+    --updatingFocus_;
+}
+
+UI_Node* UI_NodeManager::HitTest(UI_Node* root, PointT global) {
+    if (!root || !root->UI_IsShown()) {
+        return nullptr;
+    }
+    PointF local = root->UI_GlobalToLocalF(PointF(float(global.x), float(global.y)));
+    if (!root->UI_HitTest(local)) {
+        return nullptr;
+    }
+    for (std::size_t i = root->ChildSize(); i-- > 0;) {
+        UI_Node* child = root->ChildGet(i);
+        // A top-level window below another node is a separate window, found through the desktop.
+        if (OS_Window* w = child->UI_GetOSWindow(); w && w->IsTopLevel()) {
+            continue;
+        }
+        if (UI_Node* hit = HitTest(child, global)) {
+            return hit;
+        }
+    }
+    return root;
+}
+
+void UI_NodeManager::DispatchMouse(OS_Window& window, OS_Event const& event) {
+    PointT clientOrigin = window.UI_GetGlobalClientRect().TopLeft();
+    PointT global(clientOrigin.x + PointParamX(event.lParam), clientOrigin.y + PointParamY(event.lParam));
+    Desktop& desktop = Desktop::Get();
+    int act = action::Move, button = 0, clicks = 0, wheel = 0;
+    switch (event.message) {
+    case message::LeftButtonDown:
+        act = action::Press;
+        clicks = 1;
+        break;
+    case message::LeftButtonDoubleClick:
+        act = action::DoubleClickPress;
+        clicks = 2;
+        break;
+    case message::RightButtonDown:
+        act = action::SecondaryPress;
+        button = 1;
+        clicks = 1;
+        break;
+    case message::LeftButtonUp:
+        act = action::Release;
+        break;
+    case message::RightButtonUp:
+        act = action::Release;
+        button = 1;
+        break;
+    case message::MouseWheel:
+        act = action::Wheel;
+        wheel = static_cast<int>(static_cast<std::int16_t>(event.wParam >> 16));
+        break;
+    default:
+        break;
+    }
+    MouseEvent mouse(act, PointF(float(global.x), float(global.y)), global, desktop.GetModifiers(), button,
+                     clicks, wheel);
+    if (std::shared_ptr<InputCapture> capture = inputCapture_) {
+        if (capture->HandleMouseEvent(mouse)) {
+            return;
+        }
+    }
+    boost::intrusive_ptr<UI_Node> target(pointerCapture_ ? pointerCapture_ : HitTest(&window, global));
+    if (!target) {
+        return;
+    }
+    if (act == action::Move) {
+        bool set = false;
+        for (auto const& n : Chain(target.get())) {
+            if (n->UI_DoCursor(n->UI_GlobalToLocalF(PointF(float(global.x), float(global.y))))) {
+                set = true;
+                break;
+            }
+        }
+        if (!set) {
+            desktop.SetCursor(cursor::Arrow);
+        }
+    }
+    for (auto const& n : Chain(target.get())) {
+        mouse.SetLocalPoint(n->UI_GlobalToLocalF(PointF(float(global.x), float(global.y))));
+        if (n->UI_DoMouseEvent(target.get(), mouse)) {
+            break;
+        }
+    }
+}
+
+void UI_NodeManager::DispatchKey(KeyboardEvent& event) {
+    if (std::shared_ptr<InputCapture> capture = inputCapture_) {
+        if (capture->HandleKeyboardEvent(event)) {
+            return;
+        }
+    }
+    UI_Node* start = focus_;
+    if (!start) {
+        start = Desktop::Get().GetObject(Desktop::Get().GetActiveWindow());
+    }
+    for (auto const& n : Chain(start)) {
+        if (n->UI_DoKeyboardEvent(event)) {
+            break;
+        }
+    }
+}
+
+void UI_NodeManager::ForgetNode(UI_Node* node) {
+    if (focus_ == node) {
+        focus_ = nullptr;
+    }
+    if (focusAtGroupStart_ == node) {
+        focusAtGroupStart_ = nullptr;
+    }
+    if (pointerCapture_ == node) {
+        pointerCapture_ = nullptr;
+    }
+    if (modal_ && static_cast<UI_Node*>(modal_) == node) {
+        modal_ = nullptr;
+    }
+}
+
+PointerCapture::PointerCapture(UI_Node* node)
+    : previous_(UI_NodeManager::Get()->GetPointerCaptureNode()) {
+    UI_NodeManager::Get()->SetPointerCaptureNode(node);
+}
+
+PointerCapture::~PointerCapture() {
+    UI_NodeManager::Get()->SetPointerCaptureNode(previous_);
+}
+
+PointT GetGlobalMousePosition() {
+    return Desktop::Get().GetMousePosition();
+}
+
+unsigned GetCurrentModKeys() {
+    return Desktop::Get().GetModifiers();
+}
+
+} // namespace orvui::ui

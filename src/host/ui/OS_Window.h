@@ -1,0 +1,74 @@
+// A node that owns a native window of the desktop: top-level windows, popups, and the child windows
+// of frames and panels. The native window's property "orvui::ui::OS_Window::property" leads back to
+// this object, which receives the window's messages in UI_HandleOSEvent. A top-level window's node
+// rectangle is its client area at (0, 0); a child window's native rectangle follows its node.
+#pragma once
+
+#include "host/ui/UI_Container.h"
+
+namespace orvui::ui {
+
+class OS_Window : public UI_Container {
+public:
+    static constexpr char PropertyName[] = "orvui::ui::OS_Window::property";
+
+    OS_Window() = default;
+    ~OS_Window() override;
+
+    // Creates this node's native window. For the child style, owner is the parent window. Returns
+    // the handle.
+    NativeWindow UI_CreateWindow(std::u16string const& title, NativeWindow owner, RectT const& rect,
+                                 std::uint32_t style, std::uint32_t exStyle, bool hasMenu = false);
+    // Process start-up of the toolkit; nothing to do on this platform.
+    static void UI_Initialize(void*) {}
+    // Binds this node to an existing native window (the host's main window, say).
+    void UI_AttachWindow(NativeWindow window);
+    // Unbinds the native window, which lives on without this object; returns it.
+    NativeWindow UI_DetachOSWindow();
+    NativeWindow GetPlatformWindow() const { return window_; }
+    // The toolkit object of a native window, or null.
+    static OS_Window* FromNative(NativeWindow window);
+
+    // Handles a message to the native window: mouse messages go to the nodes under the pointer, the
+    // caption activation message sets the caption's look; the rest is ignored. Overrides call this
+    // for the default handling.
+    virtual void UI_HandleOSEvent(OS_Event& event);
+
+    bool IsTopLevel() const;
+    RectT UI_GetGlobalStructureRect() const;
+    void UI_SetGlobalStructureRect(RectT const& rect);
+    RectT UI_GetGlobalClientRect() const;
+    // Moves a top-level window's structure rectangle to a global top-left corner.
+    void UI_Move(PointT topLeft);
+    void UI_Activate();
+    bool UI_IsActive() const;
+    bool UI_IsMinimized() const;
+    void UI_Minimize(bool minimize);
+    // Asks the parent container to remove this window.
+    bool UI_Close();
+    // Paints the window's image now when it is marked.
+    void UpdateWindowNow();
+
+    void UI_Show(bool show) override;
+    void UI_SetRect(RectF const& rect) override;
+    OS_Window* UI_GetOSWindow() override { return this; }
+
+    // The desktop moved or resized the native window: the node follows.
+    void NativeRectChanged();
+
+private:
+    NativeWindow window_ = 0;
+};
+
+// A window with the toolkit's own drawing, for content such as pop-up menus.
+class UI_Window : public OS_Window {};
+
+// A chrome-less popup window owned by another window.
+class OS_PopupWindow : public OS_Window {
+public:
+    NativeWindow CreatePopup(NativeWindow owner, RectT const& rect, std::uint32_t exStyle = 0) {
+        return UI_CreateWindow(u"", owner, rect, 0x80000000u, exStyle);
+    }
+};
+
+} // namespace orvui::ui

@@ -1,0 +1,285 @@
+// Nodes: the tree, coordinates, showing, focus and timers.
+#include "host/ui/UI_Node.h"
+
+#include "host/ui/Desktop.h"
+#include "host/ui/NodeManager.h"
+#include "host/ui/OS_Window.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace orvui::ui {
+
+void intrusive_ptr_add_ref(UI_Node* node) {
+    ++node->refs_;
+}
+
+void intrusive_ptr_release(UI_Node* node) {
+    if (--node->refs_ == 0) {
+        delete node;
+    }
+}
+
+UI_Node::UI_Node() = default;
+
+UI_Node::~UI_Node() {
+    for (auto const& child : children_) {
+        child->parent_ = nullptr;
+    }
+    Desktop::Get().ForgetNode(this);
+    UI_NodeManager::Get()->ForgetNode(this);
+}
+
+std::vector<UI_Node*> UI_Node::UI_GetNodeParents() const {
+    std::vector<UI_Node*> parents;
+    for (UI_Node* p = parent_; p; p = p->parent_) {
+        parents.push_back(p);
+    }
+    return parents;
+}
+
+void UI_Node::Attach(UI_Node* child, std::size_t index) {
+    // Keep the child alive while it leaves its old parent.
+    boost::intrusive_ptr<UI_Node> keep(child);
+    if (child->parent_) {
+        child->parent_->ChildRemove(child);
+    }
+    index = std::min(index, children_.size());
+    children_.insert(children_.begin() + long(index), keep);
+    child->parent_ = this;
+    ChildAdded(child);
+    UI_Invalidate();
+}
+
+void UI_Node::ChildPushBack(boost::intrusive_ptr<UI_Node> child) {
+    if (child && child.get() != this) {
+        Attach(child.get(), children_.size());
+    }
+}
+
+void UI_Node::ChildInsert(std::size_t index, boost::intrusive_ptr<UI_Node> child) {
+    if (child && child.get() != this) {
+        Attach(child.get(), index);
+    }
+}
+
+bool UI_Node::ChildRemove(UI_Node* child) {
+    auto it =
+        std::find_if(children_.begin(), children_.end(), [&](auto const& c) { return c.get() == child; });
+    if (it == children_.end()) {
+        return false;
+    }
+    boost::intrusive_ptr<UI_Node> keep = *it;
+    children_.erase(it);
+    child->parent_ = nullptr;
+    ChildRemoved(child);
+    UI_Invalidate();
+    return true;
+}
+
+void UI_Node::ChildMove(UI_Node* child, std::size_t index) {
+    std::size_t from = ChildIndex(child);
+    if (from == children_.size()) {
+        return;
+    }
+    boost::intrusive_ptr<UI_Node> keep = children_[from];
+    children_.erase(children_.begin() + long(from));
+    children_.insert(children_.begin() + long(std::min(index, children_.size())), keep);
+    ChildOrderChanged();
+    UI_Invalidate();
+}
+
+std::size_t UI_Node::ChildIndex(UI_Node const* child) const {
+    for (std::size_t i = 0; i < children_.size(); ++i) {
+        if (children_[i].get() == child) {
+            return i;
+        }
+    }
+    return children_.size();
+}
+
+void UI_Node::UI_SetParent(UI_Node* parent) {
+    if (parent == parent_) {
+        return;
+    }
+    if (parent) {
+        parent->ChildPushBack(this);
+    } else if (parent_) {
+        parent_->ChildRemove(this);
+    }
+}
+
+UI_Node* UI_Node::UI_FindNodeByID(std::string const& id) {
+    if (nodeID_ == id) {
+        return this;
+    }
+    for (auto const& child : children_) {
+        if (UI_Node* found = child->UI_FindNodeByID(id)) {
+            return found;
+        }
+    }
+    return nullptr;
+}
+
+void UI_Node::UI_SetRect(RectF const& rect) {
+    bool resized = rect.width != rect_.width || rect.height != rect_.height;
+    UI_Invalidate();
+    rect_ = rect;
+    UI_Invalidate();
+    if (resized) {
+        UI_SizeChanged();
+    }
+}
+
+Matrix UI_Node::UI_GetSelfToParentMatrix() const {
+    Matrix m;
+    m.tx = rect_.left;
+    m.ty = rect_.top;
+    return m;
+}
+
+PointF UI_Node::UI_LocalToGlobalF(PointF p) const {
+    for (UI_Node const* n = this; n; n = n->parent_) {
+        if (OS_Window const* w = const_cast<UI_Node*>(n)->UI_GetOSWindow(); w && w->IsTopLevel()) {
+            RectT client = w->UI_GetGlobalClientRect();
+            return PointF(p.x + float(client.left), p.y + float(client.top));
+        }
+        p = n->UI_GetSelfToParentMatrix().Apply(p);
+    }
+    return p;
+}
+
+PointF UI_Node::UI_GlobalToLocalF(PointF p) const {
+    PointF origin = UI_LocalToGlobalF(PointF(0, 0));
+    return PointF(p.x - origin.x, p.y - origin.y);
+}
+
+PointT UI_Node::UI_LocalToGlobal(PointT p) const {
+    PointF g = UI_LocalToGlobalF(PointF(float(p.x), float(p.y)));
+    return PointT(std::int32_t(std::floor(g.x + 0.5f)), std::int32_t(std::floor(g.y + 0.5f)));
+}
+
+PointT UI_Node::UI_GlobalToLocal(PointT p) const {
+    PointF l = UI_GlobalToLocalF(PointF(float(p.x), float(p.y)));
+    return PointT(std::int32_t(std::floor(l.x + 0.5f)), std::int32_t(std::floor(l.y + 0.5f)));
+}
+
+RectT UI_Node::UI_LocalToGlobal(RectT const& r) const {
+    PointT topLeft = UI_LocalToGlobal(PointT(r.left, r.top));
+    return RectT(topLeft.x, topLeft.y, r.width, r.height);
+}
+
+RectT UI_Node::UI_GetGlobalRect() const {
+    PointF origin = UI_LocalToGlobalF(PointF(0, 0));
+    return RectT(std::int32_t(std::floor(origin.x + 0.5f)), std::int32_t(std::floor(origin.y + 0.5f)),
+                 std::int32_t(rect_.width + 0.5f), std::int32_t(rect_.height + 0.5f));
+}
+
+bool UI_Node::UI_HitTest(PointF local) const {
+    return local.x >= 0 && local.y >= 0 && local.x < rect_.width && local.y < rect_.height;
+}
+
+void UI_Node::UI_Show(bool show) {
+    if (shown_ != show) {
+        shown_ = show;
+        UI_Invalidate();
+    }
+}
+
+bool UI_Node::UI_AreAllParentsVisible() const {
+    for (UI_Node* p = parent_; p; p = p->parent_) {
+        if (!p->shown_) {
+            return false;
+        }
+    }
+    return true;
+}
+
+void UI_Node::UI_SetOpacity(float opacity) {
+    opacity_ = std::clamp(opacity, 0.0f, 1.0f);
+    if (OS_Window* w = UI_GetOSWindow(); w && w->GetPlatformWindow()) {
+        Desktop::Get().SetOpacity(w->GetPlatformWindow(), opacity_);
+    }
+    UI_Invalidate();
+}
+
+void UI_Node::UI_Invalidate(RectF const*, unsigned) {
+    for (UI_Node* n = this; n; n = n->parent_) {
+        if (OS_Window* w = n->UI_GetOSWindow(); w && w->GetPlatformWindow()) {
+            Desktop::Get().Invalidate(w->GetPlatformWindow());
+            if (w->IsTopLevel()) {
+                return;
+            }
+        }
+    }
+}
+
+void UI_Node::UI_UpdateNow(unsigned) {
+    if (OS_Window* w = UI_GetContainingWindow()) {
+        w->UpdateWindowNow();
+    }
+}
+
+void UI_Node::UI_DispatchNodeChange(int change) {
+    for (UI_Node* n = this; n; n = n->parent_) {
+        n->UI_NodeChanged(this, change);
+    }
+}
+
+bool UI_Node::UI_DoMouseEvent(UI_Node*, MouseEvent&) {
+    return false;
+}
+bool UI_Node::UI_DoKeyboardEvent(KeyboardEvent&) {
+    return false;
+}
+bool UI_Node::UI_DoCursor(PointF) {
+    return false;
+}
+void UI_Node::UI_FocusChanged(int) {}
+void UI_Node::UI_ActivationChanged(bool) {}
+
+void UI_Node::UI_GainKeyboardFocus(int reason) {
+    UI_NodeManager::Get()->SetFocusLeaf(this, reason);
+}
+
+void UI_Node::UI_LoseKeyboardFocus(int reason) {
+    if (UI_HasKeyboardFocus(true)) {
+        UI_NodeManager::Get()->SetFocusLeaf(nullptr, reason);
+    }
+}
+
+bool UI_Node::UI_HasKeyboardFocus(bool deep) const {
+    UI_Node const* leaf = UI_NodeManager::Get()->GetFocusLeaf();
+    if (!deep) {
+        return leaf == this;
+    }
+    for (UI_Node const* n = leaf; n; n = n->parent_) {
+        if (n == this) {
+            return true;
+        }
+    }
+    return false;
+}
+
+UI_Node* UI_Node::UI_GetKeyboardFocusLeafNode() {
+    return UI_NodeManager::Get()->GetFocusLeaf();
+}
+
+void UI_Node::InstallTimer(unsigned long id, double seconds, bool repeat) {
+    Desktop::Get().InstallTimer(this, id, seconds, repeat);
+}
+
+void UI_Node::RemoveTimer(unsigned long id) {
+    Desktop::Get().RemoveTimer(this, id);
+}
+
+OS_Window* UI_Node::UI_GetContainingWindow() {
+    for (UI_Node* n = this; n; n = n->parent_) {
+        if (OS_Window* w = n->UI_GetOSWindow()) {
+            return w;
+        }
+    }
+    return nullptr;
+}
+
+} // namespace orvui::ui

@@ -1,0 +1,143 @@
+// The toolkit's node: a reference-counted element of the user interface with a parent, ordered
+// children, an identifier, a rectangle in its parent's coordinates, shown state and opacity, and the
+// virtual operations through which it draws and reacts to input, focus, activation and timers.
+// Children are owned by their parent through intrusive pointers; the parent link is plain.
+#pragma once
+
+#include "host/ui/Events.h"
+
+#include <atomic>
+#include <boost/intrusive_ptr.hpp>
+#include <string>
+#include <vector>
+
+namespace canvasor {
+class Canvasor;
+}
+
+namespace orvui::ui {
+
+class OS_Window;
+class UI_Node;
+
+void intrusive_ptr_add_ref(UI_Node* node);
+void intrusive_ptr_release(UI_Node* node);
+
+// A 2-D affine transform: x' = a x + c y + tx, y' = b x + d y + ty.
+struct Matrix {
+    float a = 1, b = 0, c = 0, d = 1, tx = 0, ty = 0;
+    PointF Apply(PointF p) const { return PointF(a * p.x + c * p.y + tx, b * p.x + d * p.y + ty); }
+};
+
+class UI_Node {
+public:
+    UI_Node();
+    virtual ~UI_Node();
+    UI_Node(UI_Node const&) = delete;
+    UI_Node& operator=(UI_Node const&) = delete;
+
+    // --- Tree ---
+    UI_Node* UI_GetParentNode() const { return parent_; }
+    // The ancestors, nearest first.
+    std::vector<UI_Node*> UI_GetNodeParents() const;
+    // Moves this node under another parent (appended), or out of any tree with null.
+    void UI_SetParent(UI_Node* parent);
+    virtual void ChildPushBack(boost::intrusive_ptr<UI_Node> child);
+    void ChildInsert(std::size_t index, boost::intrusive_ptr<UI_Node> child);
+    // Takes the child out; false when it is none of ours.
+    bool ChildRemove(UI_Node* child);
+    // Moves a child to another position among its siblings.
+    void ChildMove(UI_Node* child, std::size_t index);
+    UI_Node* ChildGet(std::size_t index) const {
+        return index < children_.size() ? children_[index].get() : nullptr;
+    }
+    std::size_t ChildSize() const { return children_.size(); }
+    std::size_t ChildIndex(UI_Node const* child) const;
+    // The first node below (or this one) with the identifier, depth first.
+    UI_Node* UI_FindNodeByID(std::string const& id);
+    virtual void ChildAdded(UI_Node*) {}
+    virtual void ChildRemoved(UI_Node*) {}
+    virtual void ChildOrderChanged() {}
+    virtual bool IsANode() const { return true; }
+
+    void UI_SetNodeID(std::string id) { nodeID_ = std::move(id); }
+    std::string const& UI_GetNodeID() const { return nodeID_; }
+
+    // --- Geometry ---
+    // The rectangle in the parent's coordinates.
+    RectF UI_GetRect() const { return rect_; }
+    virtual void UI_SetRect(RectF const& rect);
+    // (0, 0, width, height).
+    RectF UI_GetLocalBounds() const { return RectF(0, 0, rect_.width, rect_.height); }
+    virtual Matrix UI_GetSelfToParentMatrix() const;
+    PointF UI_LocalToGlobalF(PointF p) const;
+    PointF UI_GlobalToLocalF(PointF p) const;
+    PointT UI_LocalToGlobal(PointT p) const;
+    PointT UI_GlobalToLocal(PointT p) const;
+    RectT UI_LocalToGlobal(RectT const& r) const;
+    // This node's rectangle in global (screen) coordinates.
+    RectT UI_GetGlobalRect() const;
+    // Whether a local point is on this node (by default: inside its bounds).
+    virtual bool UI_HitTest(PointF local) const;
+
+    // --- Showing and painting ---
+    virtual void UI_Show(bool show);
+    bool UI_IsShown() const { return shown_; }
+    // Whether every ancestor is shown.
+    virtual bool UI_AreAllParentsVisible() const;
+    void UI_SetOpacity(float opacity);
+    float UI_GetOpacity() const { return opacity_; }
+    // Marks the node's window for repainting.
+    void UI_Invalidate(RectF const* area = nullptr, unsigned flags = 0);
+    // Repaints now whatever is marked.
+    void UI_UpdateNow(unsigned flags = 0);
+    // Tells the node (and its ancestors) that something about it changed; the number is the caller's.
+    void UI_DispatchNodeChange(int change);
+    virtual void UI_NodeChanged(UI_Node*, int) {}
+    virtual void UI_Draw(canvasor::Canvasor&) {}
+
+    // --- Input, focus, activation, timers (overridden by subclasses) ---
+    // A mouse event at target, bubbling up through target's ancestors; true stops the bubbling.
+    virtual bool UI_DoMouseEvent(UI_Node* target, MouseEvent& event);
+    virtual bool UI_DoKeyboardEvent(KeyboardEvent& event);
+    // Sets the cursor for a local point and answers true, or false to let the parent decide.
+    virtual bool UI_DoCursor(PointF local);
+    virtual bool UI_DoMouseActivate() { return false; }
+    virtual void UI_SizeChanged() {}
+    virtual void UI_FocusChanged(int reason);
+    virtual void UI_ActivationChanged(bool active);
+    virtual bool UI_WantsKeyboardFocus() const { return false; }
+    virtual void UI_DoTimerNotify(unsigned long) {}
+
+    void UI_GainKeyboardFocus(int reason);
+    void UI_LoseKeyboardFocus(int reason = FocusByProgram);
+    // This node holds the focus (or, when deep, this node or one below it).
+    bool UI_HasKeyboardFocus(bool deep) const;
+    static UI_Node* UI_GetKeyboardFocusLeafNode();
+
+    // A timer of this node; fires UI_DoTimerNotify(id) every `seconds` (once unless repeat).
+    void InstallTimer(unsigned long id, double seconds, bool repeat = true);
+    void RemoveTimer(unsigned long id);
+
+    // The native window this node owns, if any.
+    virtual OS_Window* UI_GetOSWindow() { return nullptr; }
+    // The nearest native window at or above this node.
+    OS_Window* UI_GetContainingWindow();
+
+private:
+    friend void intrusive_ptr_add_ref(UI_Node* node);
+    friend void intrusive_ptr_release(UI_Node* node);
+    void Attach(UI_Node* child, std::size_t index);
+
+    std::atomic<int> refs_{0};
+    UI_Node* parent_ = nullptr;
+    std::vector<boost::intrusive_ptr<UI_Node>> children_;
+    std::string nodeID_;
+    RectF rect_;
+    bool shown_ = true;
+    float opacity_ = 1.0f;
+};
+
+using UI_NodeP = boost::intrusive_ptr<UI_Node>;
+
+} // namespace orvui::ui
