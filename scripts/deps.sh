@@ -4,7 +4,7 @@
 set -euo pipefail
 
 packages=(
-    cmake ninja-build make g++
+    cmake ninja-build make g++ pkg-config
     libboost-dev libboost-date-time-dev libboost-thread-dev libboost-system-dev
     libpugixml-dev
     libcairo2-dev fonts-dejavu-core

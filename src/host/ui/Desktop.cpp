@@ -280,14 +280,6 @@ void Desktop::ClearDirty(NativeWindow w) {
     }
 }
 
-void Desktop::PaintWindow(NativeWindow w) {
-    NativeWindow top = TopLevelOf(w);
-    if (painter_) {
-        painter_(top);
-    }
-    ClearDirty(top);
-}
-
 NativeWindow Desktop::TopLevelOf(NativeWindow w) const {
     NativeWindowRecord const* record = Find(w);
     while (record && record->parent) {

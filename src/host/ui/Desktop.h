@@ -17,6 +17,7 @@
 #pragma once
 
 #include "host/ui/Events.h"
+#include "host/ui/canvasor/Image.h"
 
 #include <functional>
 #include <map>
@@ -67,6 +68,8 @@ struct NativeWindowRecord {
     unsigned long threadId = 0;
     OS_Window* object = nullptr;
     std::vector<NativeWindow> children; // bottom to top
+    // The window's last painted image, chrome included (top-level windows only).
+    canvasor::Image image;
 };
 
 class Desktop {
@@ -120,10 +123,13 @@ public:
     void Invalidate(NativeWindow w);
     bool IsDirty(NativeWindow w) const;
     void ClearDirty(NativeWindow w);
-    // Paints a window's image now (through the installed painter) and clears its mark.
+    // Paints a top-level window's image now (its chrome, then its nodes) and clears its mark.
     void PaintWindow(NativeWindow w);
-    // The drawing layer paints windows; without one, painting only clears the mark.
-    void SetPainter(std::function<void(NativeWindow)> painter) { painter_ = std::move(painter); }
+    // The window's image, painted first when it is marked.
+    canvasor::Image WindowImage(NativeWindow w);
+    // The shown windows composited bottom to top, with their opacity, over the area of all the
+    // monitors (whose top-left corner is the image's origin).
+    canvasor::Image Snapshot();
 
     // --- Z-order and activation ---
     void BringToFront(NativeWindow w);
@@ -242,7 +248,6 @@ private:
     PointT dragStart_;
     RectT dragStartRect_;
     int dragEdges_ = 0; // bits: 1 left, 2 top, 4 right, 8 bottom
-    std::function<void(NativeWindow)> painter_;
 
     static std::unique_ptr<Desktop> instance;
 };

@@ -3,6 +3,8 @@
 
 #include "host/ui/Desktop.h"
 #include "host/ui/OS_Window.h"
+#include "host/ui/ResourceManager.h"
+#include "host/ui/canvasor/SupplierInterface.h"
 
 #include <algorithm>
 
@@ -35,7 +37,29 @@ UI_NodeManager* UI_NodeManager::Get() {
 
 UI_NodeManager::UI_NodeManager()
     : previous_(current) {
+    static canvasor::CairoSupplier supplier;
+    drawSupplier_ = &supplier;
     current = this;
+}
+
+utility::ResourceManager* UI_NodeManager::GetResourceManager() {
+    if (!resources_) {
+        resources_ = std::make_unique<utility::ResourceManager>();
+    }
+    return resources_.get();
+}
+
+canvasor::FileImageP UI_NodeManager::GetImage(std::string const& name) {
+    auto it = images_.find(name);
+    if (it != images_.end()) {
+        return it->second;
+    }
+    canvasor::FileImageP image;
+    if (drawSupplier_) {
+        image = drawSupplier_->MakeFileImage(GetResourceManager()->GetResource("png", name));
+    }
+    images_[name] = image;
+    return image;
 }
 
 UI_NodeManager::~UI_NodeManager() {

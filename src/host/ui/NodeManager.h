@@ -6,11 +6,19 @@
 
 #include "host/ui/InputCapture.h"
 
+#include "host/ui/canvasor/Image.h"
+
 #include <functional>
+#include <map>
 #include <memory>
+#include <string>
 
 namespace canvasor {
 class SupplierInterface;
+}
+
+namespace orvui::utility {
+class ResourceManager;
 }
 
 namespace orvui::ui {
@@ -80,6 +88,12 @@ public:
     void SetPointerCaptureNode(UI_Node* node) { pointerCapture_ = node; }
     UI_Node* GetPointerCaptureNode() const { return pointerCapture_; }
 
+    // --- Images ---
+    // The toolkit's resources.
+    utility::ResourceManager* GetResourceManager();
+    // A "png" resource decoded by the draw supplier, kept after the first call; null when missing.
+    canvasor::FileImageP GetImage(std::string const& name);
+
     // --- Timers ---
     unsigned long GetUniqueTimerID() { return ++lastTimerID_; }
 
@@ -123,6 +137,8 @@ private:
     int groupReason_ = 0;
     int updatingFocus_ = 0;
     UI_NodeManager* previous_ = nullptr;
+    std::unique_ptr<utility::ResourceManager> resources_;
+    std::map<std::string, canvasor::FileImageP> images_;
 };
 
 // The platform's node manager; a library makes it concrete with a public constructor.

@@ -1,0 +1,133 @@
+// Painting windows: the toolkit's chrome, then the window's nodes, each in its own translated and
+// clipped space with its opacity; and snapshots of the whole desktop.
+#include "host/core/TextConversion.h"
+#include "host/ui/Desktop.h"
+#include "host/ui/OS_Window.h"
+#include "host/ui/Theme.h"
+#include "host/ui/canvasor/Canvasor.h"
+
+#include <algorithm>
+
+namespace orvui::ui {
+
+namespace {
+
+using canvasor::Canvasor;
+
+void DrawNode(UI_Node* node, Canvasor& c, bool isRoot) {
+    if (!node->UI_IsShown()) {
+        return;
+    }
+    RectF r = node->UI_GetRect();
+    c.Save();
+    if (!isRoot) {
+        c.Translate(r.left, r.top);
+    }
+    c.ClipRect(RectF(0, 0, r.width, r.height));
+    // A window's own opacity is applied when its image is composited, not inside the image.
+    bool layered = !isRoot && node->UI_GetOpacity() < 1.0f;
+    if (layered) {
+        c.PushOpacity();
+    }
+    node->UI_Draw(c);
+    for (std::size_t i = 0; i < node->ChildSize(); ++i) {
+        UI_Node* child = node->ChildGet(i);
+        if (OS_Window* w = child->UI_GetOSWindow(); w && w->IsTopLevel()) {
+            continue; // a separate window, painted on its own
+        }
+        DrawNode(child, c, false);
+    }
+    if (layered) {
+        c.PopOpacity(node->UI_GetOpacity());
+    }
+    c.Restore();
+}
+
+void DrawChrome(Canvasor& c, NativeWindowRecord const& record, RectT const& client) {
+    RectT r = record.rect;
+    c.FillRect(RectF(0, 0, float(r.width), float(r.height)), GetColor(color::WindowBorder));
+    RectF title{float(BorderWidth), float(BorderWidth), float(r.width - 2 * BorderWidth),
+                float(TitleBarHeight)};
+    c.FillRect(title, GetColor(record.captionActive ? color::TitleBarActive : color::TitleBarInactive));
+    c.Save();
+    c.ClipRect(title);
+    c.DrawText(orvcore::utility::UTF16to8(record.title), PointF(title.left + 6, title.top + 4),
+               canvasor::Font(), GetColor(color::TitleText));
+    c.Restore();
+    if (record.hasMenu) {
+        c.FillRect(RectF(float(BorderWidth), float(BorderWidth + TitleBarHeight),
+                         float(r.width - 2 * BorderWidth), float(MenuBarHeight)),
+                   GetColor(color::MenuBar));
+    }
+    (void)client;
+}
+
+} // namespace
+
+void Desktop::PaintWindow(NativeWindow w) {
+    NativeWindow top = TopLevelOf(w);
+    NativeWindowRecord* record = Find(top);
+    if (!record) {
+        return;
+    }
+    RectT r = record->rect;
+    canvasor::Image image(r.width, r.height);
+    {
+        Canvasor c(image);
+        RectT client = GetClientRect(top);
+        if ((record->style & style::Caption) == style::Caption) {
+            DrawChrome(c, *record, client);
+        }
+        RectF clientArea(float(client.left - r.left), float(client.top - r.top), float(client.width),
+                         float(client.height));
+        c.FillRect(clientArea, GetColor(color::WindowBackground));
+        if (record->object) {
+            c.Save();
+            c.Translate(clientArea.left, clientArea.top);
+            DrawNode(record->object, c, true);
+            c.Restore();
+        }
+    }
+    record = Find(top); // drawing code may not add windows, but stay safe
+    if (record) {
+        record->image = image;
+        record->dirty = false;
+    }
+}
+
+canvasor::Image Desktop::WindowImage(NativeWindow w) {
+    NativeWindow top = TopLevelOf(w);
+    NativeWindowRecord const* record = Find(top);
+    if (!record) {
+        return canvasor::Image();
+    }
+    if (record->dirty || record->image.IsEmpty()) {
+        PaintWindow(top);
+    }
+    return Find(top)->image;
+}
+
+canvasor::Image Desktop::Snapshot() {
+    RectT area = monitors_.front();
+    for (RectT const& m : monitors_) {
+        area = area.Union(m);
+    }
+    canvasor::Image screen(area.width, area.height);
+    std::vector<NativeWindow> order = zOrder_;
+    Canvasor c(screen);
+    c.FillRect(RectF(0, 0, float(area.width), float(area.height)), canvasor::ColorRGBA(0, 0, 0, 1));
+    for (NativeWindow w : order) {
+        NativeWindowRecord const* record = Find(w);
+        if (!record || !record->shown || record->showState == ShowState::Minimized) {
+            continue;
+        }
+        canvasor::Image image = WindowImage(w);
+        RectT r = Find(w)->rect;
+        c.DrawImage(
+            image, RectF(float(r.left - area.left), float(r.top - area.top), float(r.width), float(r.height)),
+            Find(w)->opacity);
+    }
+    return screen;
+}
+
+} // namespace orvui::ui

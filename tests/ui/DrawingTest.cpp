@@ -1,0 +1,120 @@
+// Drawing: the canvas, images and resources, and snapshots of windows with their chrome, background
+// and opacity.
+#include "UiDoubles.h"
+
+#include "host/ui/NodeManager.h"
+#include "host/ui/ResourceManager.h"
+#include "host/ui/Theme.h"
+#include "host/ui/canvasor/Canvasor.h"
+#include "host/ui/canvasor/SupplierInterface.h"
+
+#include <cmath>
+
+using namespace orvtest;
+using canvasor::Canvasor;
+using canvasor::ColorRGBA;
+using canvasor::Image;
+
+namespace {
+
+::testing::AssertionResult Near(ColorRGBA actual, ColorRGBA expected, float tolerance = 0.02f) {
+    if (std::fabs(actual.r - expected.r) <= tolerance && std::fabs(actual.g - expected.g) <= tolerance &&
+        std::fabs(actual.b - expected.b) <= tolerance && std::fabs(actual.a - expected.a) <= tolerance) {
+        return ::testing::AssertionSuccess();
+    }
+    return ::testing::AssertionFailure() << "colour (" << actual.r << ", " << actual.g << ", " << actual.b
+                                         << ", " << actual.a << ") is not (" << expected.r << ", "
+                                         << expected.g << ", " << expected.b << ", " << expected.a << ")";
+}
+
+// A node that fills itself with one colour.
+class Swatch : public UI_Node {
+public:
+    explicit Swatch(ColorRGBA c)
+        : color(c) {}
+    void UI_Draw(Canvasor& c) override { c.FillRect(UI_GetLocalBounds(), color); }
+    ColorRGBA color;
+};
+
+} // namespace
+
+TEST(Canvas, FillsGradientsAndText) {
+    Image image(100, 40);
+    {
+        Canvasor c(image);
+        c.FillRect(RectF(0, 0, 50, 40), ColorRGBA(1, 0, 0, 1));
+        c.FillRect(RectF(50, 0, 50, 40),
+                   canvasor::LinearGradient{PointF(50, 0), PointF(100, 0), ColorRGBA(0, 0, 0, 1),
+                                            ColorRGBA(0, 0, 1, 1)});
+        c.Save();
+        c.Translate(10, 10);
+        c.ClipRect(RectF(0, 0, 5, 5));
+        c.FillRect(RectF(0, 0, 100, 100), ColorRGBA(0, 1, 0, 1)); // clipped to 5 × 5 at (10, 10)
+        c.Restore();
+        canvasor::TextMetrics shortText = c.MeasureText("ab", canvasor::Font());
+        canvasor::TextMetrics longText = c.MeasureText("abcdef", canvasor::Font());
+        EXPECT_GT(shortText.width, 5);
+        EXPECT_GT(longText.width, 2.5f * shortText.width);
+        EXPECT_NEAR(shortText.height, 13, 3); // DejaVu Sans at 11 pixels
+    }
+    EXPECT_TRUE(Near(image.Pixel(5, 5), ColorRGBA(1, 0, 0, 1)));
+    EXPECT_TRUE(Near(image.Pixel(12, 12), ColorRGBA(0, 1, 0, 1)));
+    EXPECT_TRUE(Near(image.Pixel(16, 16), ColorRGBA(1, 0, 0, 1)));
+    EXPECT_TRUE(Near(image.Pixel(75, 20), ColorRGBA(0, 0, 0.5f, 1), 0.03f));
+    EXPECT_EQ(image.Pixel(-1, 0), ColorRGBA());
+}
+
+TEST(Canvas, ImagesRoundTripAsPngAndResourcesDecode) {
+    Image image(3, 2);
+    {
+        Canvasor c(image);
+        c.FillRect(RectF(0, 0, 3, 2), ColorRGBA(0.2f, 0.4f, 0.6f, 1));
+    }
+    Image back = Image::FromPNG(image.ToPNG());
+    ASSERT_FALSE(back.IsEmpty());
+    EXPECT_EQ(back.Width(), 3);
+    EXPECT_TRUE(Near(back.Pixel(2, 1), ColorRGBA(0.2f, 0.4f, 0.6f, 1)));
+    EXPECT_TRUE(Image::FromPNG("not a png").IsEmpty());
+    EXPECT_TRUE(Image::FromPNG(image.ToPNG().substr(0, 20)).IsEmpty()); // truncated
+
+    orvui::utility::ResourceManager resources;
+    for (char const* name : {"closebox", "gripper", "DownArrow", "SP_PopupToolSelect_5x5_N"}) {
+        EXPECT_FALSE(Image::FromPNG(resources.GetResource("png", name)).IsEmpty()) << name;
+    }
+    EXPECT_TRUE(resources.GetResource("png", "nothing").empty());
+    canvasor::FileImageP box = UI_NodeManager::Get()->GetImage("closebox");
+    ASSERT_NE(box, nullptr);
+    EXPECT_EQ(box->Width(), 11);
+    EXPECT_EQ(UI_NodeManager::Get()->GetImage("closebox"), box); // decoded once
+    EXPECT_EQ(UI_NodeManager::Get()->GetImage("nothing"), nullptr);
+}
+
+TEST_F(DesktopTest, SnapshotShowsChromeBackgroundNodesAndOpacity) {
+    auto back = MakeWindow(RectT(100, 100, 400, 300));
+    boost::intrusive_ptr<Swatch> red(new Swatch(ColorRGBA(1, 0, 0, 1)));
+    back->ChildPushBack(red);
+    red->UI_SetRect(RectF(0, 0, 100, 100));
+    back->UI_Activate();
+    Image shot = desktop().Snapshot();
+    RectT client = back->UI_GetGlobalClientRect();
+    EXPECT_TRUE(Near(shot.Pixel(client.left + 50, client.top + 50), ColorRGBA(1, 0, 0, 1)));
+    EXPECT_TRUE(Near(shot.Pixel(client.left + 300, client.top + 200), GetColor(color::WindowBackground)));
+    EXPECT_TRUE(Near(shot.Pixel(300, 110), GetColor(color::TitleBarActive)));
+    EXPECT_TRUE(Near(shot.Pixel(1500, 900), ColorRGBA(0, 0, 0, 1))); // no window there
+
+    // A half-transparent popup over the red node blends with it.
+    boost::intrusive_ptr<RecordingWindow> popup(new RecordingWindow);
+    popup->UI_CreateWindow(u"", 0, RectT(client.left + 20, client.top + 20, 40, 40),
+                           style::Popup | style::Visible, 0);
+    boost::intrusive_ptr<Swatch> blue(new Swatch(ColorRGBA(0, 0, 1, 1)));
+    popup->ChildPushBack(blue);
+    blue->UI_SetRect(RectF(0, 0, 40, 40));
+    popup->UI_SetOpacity(0.5f);
+    shot = desktop().Snapshot();
+    EXPECT_TRUE(Near(shot.Pixel(client.left + 30, client.top + 30), ColorRGBA(0.5f, 0, 0.5f, 1)));
+    // Hiding a node repaints the window without it.
+    red->UI_Show(false);
+    EXPECT_TRUE(desktop().IsDirty(back->GetPlatformWindow()));
+    shot = desktop().Snapshot();
+    EXPECT_TRUE(Near(shot.Pixel(client.left + 5, client.top + 5), GetColor(color::WindowBackground)));
+}
