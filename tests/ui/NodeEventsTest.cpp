@@ -3,6 +3,7 @@
 #include "UiDoubles.h"
 
 #include "host/ui/InputCapture.h"
+#include "host/ui/Theme.h"
 
 using namespace orvtest;
 
@@ -212,4 +213,79 @@ TEST_F(NodeTest, ChildrenCanBeReorderedAndFound) {
     second->UI_SetParent(nullptr);
     EXPECT_EQ(outer->ChildSize(), 1u);
     EXPECT_FALSE(window->ChildRemove(second.get()));
+}
+
+TEST_F(NodeTest, TabMovesFocusThroughTheWindowAndShiftTabBack) {
+    boost::intrusive_ptr<RecordingNode> third(new RecordingNode("third", &log));
+    window->ChildPushBack(third);
+    KeyboardEvent tab(key::Tab, true, 0);
+    EXPECT_TRUE(window->UI_DoAdvanceKeyboardFocus(tab));
+    EXPECT_EQ(UI_Node::UI_GetKeyboardFocusLeafNode(), outer.get()); // tree order: outer, inner, third
+    EXPECT_TRUE(window->UI_DoAdvanceKeyboardFocus(tab));
+    EXPECT_EQ(UI_Node::UI_GetKeyboardFocusLeafNode(), inner.get());
+    EXPECT_TRUE(window->UI_DoAdvanceKeyboardFocus(tab));
+    EXPECT_TRUE(window->UI_DoAdvanceKeyboardFocus(tab)); // wraps round
+    EXPECT_EQ(UI_Node::UI_GetKeyboardFocusLeafNode(), outer.get());
+    KeyboardEvent backTab(key::Tab, true, modifier::Shift);
+    EXPECT_TRUE(window->UI_DoAdvanceKeyboardFocus(backTab));
+    EXPECT_EQ(UI_Node::UI_GetKeyboardFocusLeafNode(), third.get());
+    KeyboardEvent other('A', true, 0);
+    EXPECT_FALSE(window->UI_DoAdvanceKeyboardFocus(other));
+    third->UI_Show(false); // hidden nodes are skipped
+    EXPECT_TRUE(window->UI_DoAdvanceKeyboardFocus(tab));
+    EXPECT_EQ(UI_Node::UI_GetKeyboardFocusLeafNode(), outer.get());
+}
+
+TEST_F(NodeTest, PressesOfferMouseActivationBeforeTheEvent) {
+    struct Activating : RecordingNode {
+        using RecordingNode::RecordingNode;
+        bool UI_DoMouseActivate() override {
+            log->push_back(name + ":activate");
+            return true;
+        }
+    };
+    boost::intrusive_ptr<Activating> panel(new Activating("panel", &log));
+    inner->ChildPushBack(panel);
+    panel->UI_SetRect(RectF(0, 0, 10, 10));
+    desktop().MouseDown(At(16, 26));
+    desktop().MouseMove(At(17, 26));
+    // The panel sits at inner's origin, so both see the same local point.
+    EXPECT_EQ(log,
+              (std::vector<std::string>{"panel:activate", "panel:1@1,1", "inner:1@1,1 via", "outer:1@6,6 via",
+                                        "panel:5@2,1", "inner:5@2,1 via", "outer:5@7,6 via"}));
+}
+
+TEST_F(NodeTest, GuardsAndThemeNotifications) {
+    UI_NodeManager* manager = UI_NodeManager::Get();
+    EXPECT_FALSE(manager->MouseOverUpdatesSuspended());
+    {
+        UI_NodeManager::SuspendMouseOverUpdates freeze;
+        UI_NodeManager::SuspendMouseOverUpdates again;
+        EXPECT_TRUE(manager->MouseOverUpdatesSuspended());
+    }
+    EXPECT_FALSE(manager->MouseOverUpdatesSuspended());
+    std::vector<std::string> heard;
+    manager->InstallUserResizeFunction([&](bool begin, UI_Node* node, bool) {
+        heard.push_back((begin ? "begin " : "end ") + node->UI_GetNodeID());
+    });
+    window->UI_SetNodeID("window");
+    { UI_NodeManager::NotifyUserResizing resizing(window.get()); }
+    EXPECT_EQ(heard, (std::vector<std::string>{"begin window", "end window"}));
+    manager->InstallUserResizeFunction(nullptr);
+    EXPECT_NE(manager->GetUniqueTimerID(), manager->GetUniqueTimerID());
+
+    int changes = 0;
+    InstallThemeChangedFunction([&] { ++changes; });
+    Theme::Current().SetColor(color::WindowBackground, canvasor::ColorRGBA(1, 1, 1, 1));
+    Theme::Current().SetName("Light", false);
+    Theme::Current().SetName("Light", true);
+    EXPECT_EQ(changes, 2);
+    EXPECT_EQ(GetColor(color::WindowBackground), canvasor::ColorRGBA(1, 1, 1, 1));
+    EXPECT_EQ(GetColor(9999), canvasor::ColorRGBA(1, 0, 1, 1)); // a missing number shows
+    InstallThemeChangedFunction(nullptr);
+    Theme::Terminate();
+    EXPECT_NE(GetColor(color::WindowBackground), canvasor::ColorRGBA(1, 1, 1, 1)); // defaults again
+    EXPECT_EQ(Theme::Current().GetFontName(FontKind::Normal), "DejaVu Sans");
+    EXPECT_EQ(WINtoORV(ORVtoWIN(RectT(10, 20, 30, 40))), RectT(10, 20, 30, 40));
+    EXPECT_EQ(ORVtoWIN(RectT(10, 20, 30, 40)).right, 40);
 }

@@ -234,6 +234,13 @@ void UI_NodeManager::DispatchMouse(OS_Window& window, OS_Event const& event) {
             desktop.SetCursor(cursor::Arrow);
         }
     }
+    if (act == action::Press || act == action::SecondaryPress || act == action::DoubleClickPress) {
+        for (auto const& n : Chain(target.get())) {
+            if (n->UI_DoMouseActivate()) {
+                break;
+            }
+        }
+    }
     for (auto const& n : Chain(target.get())) {
         mouse.SetLocalPoint(n->UI_GlobalToLocalF(PointF(float(global.x), float(global.y))));
         if (n->UI_DoMouseEvent(target.get(), mouse)) {

@@ -98,6 +98,20 @@ inline constexpr int TitleBarHeight = 22;
 inline constexpr int BorderWidth = 3;
 inline constexpr int MenuBarHeight = 20;
 
+// A rectangle as the platform writes it: edges rather than a size.
+struct WinRect {
+    std::int32_t left = 0, top = 0, right = 0, bottom = 0;
+    bool operator==(WinRect const& o) const {
+        return left == o.left && top == o.top && right == o.right && bottom == o.bottom;
+    }
+};
+inline WinRect ORVtoWIN(RectT const& r) {
+    return WinRect{r.left, r.top, r.Right(), r.Bottom()};
+}
+inline RectT WINtoORV(WinRect const& r) {
+    return RectT::FromEdges(r.left, r.top, r.right, r.bottom);
+}
+
 // The low and high signed 16-bit halves of a message parameter holding a point.
 inline std::intptr_t MakePointParam(int x, int y) {
     return static_cast<std::intptr_t>((static_cast<std::uint32_t>(static_cast<std::uint16_t>(y)) << 16) |

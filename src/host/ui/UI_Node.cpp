@@ -226,6 +226,62 @@ void UI_Node::UI_DispatchNodeChange(int change) {
     }
 }
 
+canvasor::SupplierInterface* UI_Node::UI_GetDrawSupplier() const {
+    return parent_ ? parent_->UI_GetDrawSupplier() : UI_NodeManager::Get()->GetOSDrawSupplier();
+}
+
+namespace {
+void CollectFocusable(UI_Node* node, std::vector<UI_Node*>& out) {
+    if (!node->UI_IsShown()) {
+        return;
+    }
+    if (node->UI_WantsKeyboardFocus()) {
+        out.push_back(node);
+    }
+    for (std::size_t i = 0; i < node->ChildSize(); ++i) {
+        UI_Node* child = node->ChildGet(i);
+        if (OS_Window* w = child->UI_GetOSWindow(); w && w->IsTopLevel()) {
+            continue;
+        }
+        CollectFocusable(child, out);
+    }
+}
+} // namespace
+
+bool UI_Node::UI_DoAdvanceKeyboardFocus(KeyboardEvent& event) {
+    if (event.GetKeyCode() != key::Tab || !event.IsKeyDown()) {
+        return false;
+    }
+    UI_Node* root = this;
+    for (UI_Node* n = this; n; n = n->parent_) {
+        root = n;
+        if (OS_Window* w = n->UI_GetOSWindow(); w && w->IsTopLevel()) {
+            break;
+        }
+    }
+    std::vector<UI_Node*> focusable;
+    CollectFocusable(root, focusable);
+    if (focusable.empty()) {
+        return false;
+    }
+    UI_Node* leaf = UI_GetKeyboardFocusLeafNode();
+    auto at = std::find(focusable.begin(), focusable.end(), leaf);
+    bool back = (event.GetModifiers() & modifier::Shift) != 0;
+    std::size_t count = focusable.size();
+    std::size_t index;
+    if (at == focusable.end()) {
+        index = back ? count - 1 : 0;
+    } else {
+        std::size_t current = std::size_t(at - focusable.begin());
+        index = back ? (current + count - 1) % count : (current + 1) % count;
+    }
+    if (focusable[index] == leaf) {
+        return false;
+    }
+    focusable[index]->UI_GainKeyboardFocus(FocusByKeyboard);
+    return true;
+}
+
 bool UI_Node::UI_DoMouseEvent(UI_Node*, MouseEvent&) {
     return false;
 }

@@ -13,7 +13,8 @@
 
 namespace canvasor {
 class Canvasor;
-}
+class SupplierInterface;
+} // namespace canvasor
 
 namespace orvui::ui {
 
@@ -95,6 +96,17 @@ public:
     void UI_DispatchNodeChange(int change);
     virtual void UI_NodeChanged(UI_Node*, int) {}
     virtual void UI_Draw(canvasor::Canvasor&) {}
+    // Whether the node draws with the toolkit's canvas (all of ours do).
+    virtual bool UI_SupportsCanvasor() const { return true; }
+    // The parts of the node it paints itself, in local coordinates; by default all of it.
+    virtual void UI_GetDrawSegments(std::vector<RectF>& segments) const {
+        segments.push_back(UI_GetLocalBounds());
+    }
+    // The supplier of fonts and images for this node's drawing: its parent's, finally the node
+    // manager's.
+    virtual canvasor::SupplierInterface* UI_GetDrawSupplier() const;
+    // Whether a window's root view covers it completely, so nothing behind needs painting.
+    virtual bool UI_IsRootViewOpaque() const { return false; }
 
     // --- Input, focus, activation, timers (overridden by subclasses) ---
     // A mouse event at target, bubbling up through target's ancestors; true stops the bubbling.
@@ -102,7 +114,12 @@ public:
     virtual bool UI_DoKeyboardEvent(KeyboardEvent& event);
     // Sets the cursor for a local point and answers true, or false to let the parent decide.
     virtual bool UI_DoCursor(PointF local);
+    // A press is about to reach this node (or one below it); true when the node took it to activate
+    // itself.
     virtual bool UI_DoMouseActivate() { return false; }
+    // Moves keyboard focus on Tab (back with Shift) to the next node of the same top-level window
+    // that wants it, in tree order, wrapping round; true when focus moved.
+    virtual bool UI_DoAdvanceKeyboardFocus(KeyboardEvent& event);
     virtual void UI_SizeChanged() {}
     virtual void UI_FocusChanged(int reason);
     virtual void UI_ActivationChanged(bool active);
