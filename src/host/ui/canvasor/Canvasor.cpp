@@ -101,6 +101,12 @@ TextMetrics Canvasor::MeasureText(std::string const& utf8, Font const& font) {
     return TextMetrics{float(text.x_advance), float(extents.height), float(extents.ascent)};
 }
 
+TextMetrics Canvasor::Measure(std::string const& utf8, Font const& font) {
+    static Image scratch(1, 1);
+    Canvasor c(scratch);
+    return c.MeasureText(utf8, font);
+}
+
 void Canvasor::DrawImage(Image const& image, RectF const& r, float opacity) {
     if (image.IsEmpty() || image.Width() == 0 || image.Height() == 0) {
         return;
@@ -121,6 +127,10 @@ void Canvasor::Restore() {
 }
 void Canvasor::Translate(float dx, float dy) {
     cairo_translate(cr_, dx, dy);
+}
+
+void Canvasor::Rotate(float radians) {
+    cairo_rotate(cr_, radians);
 }
 
 void Canvasor::ClipRect(RectF const& r) {

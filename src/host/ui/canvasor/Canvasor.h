@@ -66,6 +66,8 @@ public:
     // Text with its top-left corner at p (UTF-8).
     void DrawText(std::string const& utf8, PointF p, Font const& font, ColorRGBA const& color);
     TextMetrics MeasureText(std::string const& utf8, Font const& font);
+    // Measures without a canvas at hand (layout code).
+    static TextMetrics Measure(std::string const& utf8, Font const& font);
 
     // An image scaled into a rectangle, at an opacity.
     void DrawImage(Image const& image, RectF const& rect, float opacity = 1.0f);
@@ -74,6 +76,8 @@ public:
     void Save();
     void Restore();
     void Translate(float dx, float dy);
+    // Turns the drawing space by an angle in radians (positive turns clockwise on screen).
+    void Rotate(float radians);
     void ClipRect(RectF const& rect);
     // Drawing up to the matching PopOpacity is blended in at this opacity.
     void PushOpacity();
