@@ -1,0 +1,54 @@
+// Modal windows and the loop that runs them. A modal window disables its owner, takes the keyboard
+// focus and processes input until it ends with a result. Headless runs answer modals through a
+// ModalDriver, called on every turn of the loop with the modal window, which may inject input or end
+// it; with no driver installed a modal ends at once with its cancel answer, so nothing ever waits
+// for a person who is not there. A modal that no driver ends within a bounded number of turns is
+// cancelled too.
+#pragma once
+
+#include "host/ui/OS_Window.h"
+
+#include <functional>
+
+namespace orvui::ui {
+
+class UI_ModalWindow : public OS_Window {
+public:
+    // Ends the loop with a result.
+    void EndModal(int result);
+    bool IsModalDone() const { return done_; }
+    int GetModalResult() const { return result_; }
+    // The answer when the modal is cancelled (Escape, a click outside, no driver).
+    void SetCancelResult(int result) { cancelResult_ = result; }
+    int GetCancelResult() const { return cancelResult_; }
+    virtual void CancelModal() { EndModal(cancelResult_); }
+
+    // Shows the window, runs the loop until it ends, hides it, and returns the result.
+    int RunModal();
+
+private:
+    bool done_ = false;
+    int result_ = 0;
+    int cancelResult_ = 0;
+};
+
+// Called on each turn of a modal loop with the modal window.
+using ModalDriver = std::function<void(UI_ModalWindow& modal)>;
+// Installs the driver for headless runs (empty: none); returns the previous one.
+ModalDriver SetModalDriver(ModalDriver driver);
+bool HasModalDriver();
+
+// Installs a driver for a scope.
+class ScopedModalDriver {
+public:
+    explicit ScopedModalDriver(ModalDriver driver)
+        : previous_(SetModalDriver(std::move(driver))) {}
+    ~ScopedModalDriver() { SetModalDriver(std::move(previous_)); }
+    ScopedModalDriver(ScopedModalDriver const&) = delete;
+    ScopedModalDriver& operator=(ScopedModalDriver const&) = delete;
+
+private:
+    ModalDriver previous_;
+};
+
+} // namespace orvui::ui
