@@ -2,6 +2,7 @@
 // placements.
 #include "UiDoubles.h"
 
+#include "host/ui/InputCapture.h"
 #include "host/ui/MonitorInfo.h"
 
 using namespace orvtest;
@@ -182,4 +183,74 @@ TEST_F(DesktopTest, MonitorsByIndexPointAndVisibility) {
     EXPECT_EQ(lost, RectT(2900, 824, 300, 200));
     RectT fine(10, 10, 300, 200);
     EXPECT_FALSE(monitors.EnsureRectIsVisible(fine));
+}
+
+TEST_F(DesktopTest, ChildWindowsFollowTheirNodesToAnotherWindow) {
+    auto first = MakeWindow(RectT(0, 0, 400, 300));
+    auto second = MakeWindow(RectT(500, 0, 400, 300));
+    boost::intrusive_ptr<RecordingWindow> frame(new RecordingWindow);
+    first->ChildPushBack(frame);
+    frame->UI_CreateWindow(u"Frame", first->GetPlatformWindow(), RectT(10, 10, 100, 100),
+                           style::Child | style::Visible, 0);
+    second->ChildPushBack(frame); // a frame dragged to another window
+    EXPECT_EQ(desktop().GetParent(frame->GetPlatformWindow()), second->GetPlatformWindow());
+    RectT client = second->UI_GetGlobalClientRect();
+    EXPECT_EQ(desktop().WindowFromPoint(PointT(client.left + 20, client.top + 20)),
+              frame->GetPlatformWindow());
+    first.reset(); // the old window goes; the frame lives on in the new one
+    EXPECT_TRUE(desktop().IsWindow(frame->GetPlatformWindow()));
+    EXPECT_FALSE(frame->IsTopLevel());
+    EXPECT_EQ(frame->UI_GetGlobalRect().left, client.left + 10);
+}
+
+TEST_F(DesktopTest, DestroyedOrResetWindowsLeaveNoDanglingHandles) {
+    auto w = MakeWindow(RectT(0, 0, 400, 300));
+    NativeWindow handle = w->GetPlatformWindow();
+    desktop().DestroyNativeWindow(handle);
+    EXPECT_EQ(w->GetPlatformWindow(), 0u);
+    EXPECT_FALSE(w->IsTopLevel());
+    auto survivor = MakeWindow(RectT(0, 0, 100, 100));
+    Desktop::Reset(); // a new desktop while the object still lives
+    auto fresh = MakeWindow(RectT(0, 0, 200, 200));
+    EXPECT_NE(fresh->GetPlatformWindow(), handle); // handles are never reused
+    survivor.reset();                              // must not take the new desktop's window with it
+    EXPECT_TRUE(desktop().IsWindow(fresh->GetPlatformWindow()));
+}
+
+TEST_F(DesktopTest, ApplicationReturningReactivatesItsWindow) {
+    auto a = MakeWindow(RectT(0, 0, 400, 300));
+    a->UI_Activate();
+    desktop().SetApplicationActive(false);
+    EXPECT_FALSE(desktop().IsCaptionActive(a->GetPlatformWindow()));
+    EXPECT_EQ(desktop().GetActiveWindow(), 0u);
+    desktop().SetApplicationActive(true);
+    EXPECT_EQ(desktop().GetActiveWindow(), a->GetPlatformWindow());
+    EXPECT_TRUE(desktop().IsCaptionActive(a->GetPlatformWindow()));
+}
+
+TEST_F(DesktopTest, AMinimisedMaximisedWindowRestoresMaximised) {
+    auto w = MakeWindow(RectT(100, 100, 400, 300));
+    WindowPlacement p = desktop().GetPlacement(w->GetPlatformWindow());
+    p.showCmd = 3;
+    desktop().SetPlacement(w->GetPlatformWindow(), p);
+    w->UI_Minimize(true);
+    EXPECT_TRUE(w->UI_IsMinimized());
+    w->UI_Minimize(false);
+    EXPECT_TRUE(desktop().IsZoomed(w->GetPlatformWindow()));
+}
+
+TEST_F(DesktopTest, APointerCaptureGetsTheReleaseAnywhere) {
+    auto w = MakeWindow(RectT(0, 0, 400, 300));
+    std::vector<std::string> log;
+    boost::intrusive_ptr<RecordingNode> chip(new RecordingNode("chip", &log));
+    w->ChildPushBack(chip);
+    chip->UI_SetRect(RectF(0, 0, 50, 50));
+    {
+        PointerCapture capture(chip.get());
+        EXPECT_EQ(desktop().GetCapture(), w->GetPlatformWindow());
+        desktop().MouseUp(PointT(1500, 900)); // over no window at all
+    }
+    ASSERT_FALSE(log.empty());
+    EXPECT_EQ(log.back().substr(0, 7), "chip:2@");
+    EXPECT_EQ(desktop().GetCapture(), 0u);
 }

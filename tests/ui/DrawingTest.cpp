@@ -112,6 +112,12 @@ TEST_F(DesktopTest, SnapshotShowsChromeBackgroundNodesAndOpacity) {
     popup->UI_SetOpacity(0.5f);
     shot = desktop().Snapshot();
     EXPECT_TRUE(Near(shot.Pixel(client.left + 30, client.top + 30), ColorRGBA(0.5f, 0, 0.5f, 1)));
+    // A layered overlay shows only what it draws: the window beneath shows through the rest.
+    boost::intrusive_ptr<RecordingWindow> overlay(new RecordingWindow);
+    overlay->UI_CreateWindow(u"", 0, RectT(client.left + 60, client.top + 60, 40, 40),
+                             style::Popup | style::Visible, style::Layered | style::MouseTransparent);
+    shot = desktop().Snapshot();
+    EXPECT_TRUE(Near(shot.Pixel(client.left + 70, client.top + 70), ColorRGBA(1, 0, 0, 1)));
     // Hiding a node repaints the window without it.
     red->UI_Show(false);
     EXPECT_TRUE(desktop().IsDirty(back->GetPlatformWindow()));

@@ -193,10 +193,21 @@ TEST_F(NodeTest, QueuedCallsRunWhenDueInOrderWithTimers) {
     desktop().AdvanceTime(1);
     EXPECT_EQ(order, (std::vector<std::string>{"now", "later"}));
     EXPECT_EQ(log, std::vector<std::string>{"outer:timer9@0.200000"});
-    // Calls queued by calls run in the same turn.
+    // Calls queued by calls wait for the next turn, so a call that queues itself cannot hang a turn.
     desktop().PostToMainThread([&] { desktop().PostToMainThread([&] { order.push_back("chained"); }); });
     desktop().ProcessPendingWork();
+    EXPECT_EQ(order.back(), "later");
+    desktop().ProcessPendingWork();
     EXPECT_EQ(order.back(), "chained");
+    int runs = 0;
+    std::function<void()> again = [&] {
+        ++runs;
+        desktop().PostToMainThread(again);
+    };
+    desktop().PostToMainThread(again);
+    desktop().ProcessPendingWork();
+    desktop().AdvanceTime(1);
+    EXPECT_EQ(runs, 2);
 }
 
 TEST_F(NodeTest, ChildrenCanBeReorderedAndFound) {
@@ -288,4 +299,27 @@ TEST_F(NodeTest, GuardsAndThemeNotifications) {
     EXPECT_EQ(Theme::Current().GetFontName(FontKind::Normal), "DejaVu Sans");
     EXPECT_EQ(WINtoORV(ORVtoWIN(RectT(10, 20, 30, 40))), RectT(10, 20, 30, 40));
     EXPECT_EQ(ORVtoWIN(RectT(10, 20, 30, 40)).right, 40);
+}
+
+TEST_F(NodeTest, KeysGoToTheFocusOrTheActiveWindowAndStopThere) {
+    struct KeyWindow : RecordingWindow {
+        std::vector<std::string>* log = nullptr;
+        bool UI_DoKeyboardEvent(KeyboardEvent& e) override {
+            log->push_back("window:key" + std::to_string(e.GetKeyCode()));
+            return false;
+        }
+    };
+    boost::intrusive_ptr<UI_Container> host(new UI_Container);
+    boost::intrusive_ptr<RecordingNode> above(new RecordingNode("above", &log));
+    above->ChildPushBack(host);
+    boost::intrusive_ptr<KeyWindow> keyed(new KeyWindow);
+    keyed->log = &log;
+    host->ChildPushBack(keyed);
+    keyed->UI_CreateWindow(u"keys", 0, RectT(600, 100, 300, 200),
+                           style::Popup | style::Caption | style::Visible, 0);
+    keyed->UI_Activate();
+    desktop().KeyDown('K');                                   // no focus: the active window
+    EXPECT_EQ(log, std::vector<std::string>{"window:key75"}); // and not the nodes above the window
+    keyed.reset();
+    host->DeleteChildren();
 }

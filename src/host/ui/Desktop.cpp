@@ -112,7 +112,14 @@ void Desktop::DestroyNativeWindow(NativeWindow w) {
         drag_ = Drag::None;
         dragWindow_ = 0;
     }
+    if (lastActive_ == w) {
+        lastActive_ = 0;
+    }
+    OS_Window* object = record->object;
     records_.erase(w);
+    if (object) {
+        object->NativeDestroyed();
+    }
 }
 
 void Desktop::SetObject(NativeWindow w, OS_Window* object) {
@@ -130,6 +137,17 @@ OS_Window* Desktop::GetObject(NativeWindow w) const {
 NativeWindow Desktop::GetParent(NativeWindow w) const {
     NativeWindowRecord const* record = Find(w);
     return record ? (record->parent ? record->parent : record->owner) : 0;
+}
+
+void Desktop::SetParent(NativeWindow child, NativeWindow parent) {
+    NativeWindowRecord* record = Find(child);
+    if (!record || !record->parent || !Find(parent) || record->parent == parent || child == parent) {
+        return;
+    }
+    auto& siblings = Find(record->parent)->children;
+    siblings.erase(std::remove(siblings.begin(), siblings.end(), child), siblings.end());
+    record->parent = parent;
+    Find(parent)->children.push_back(child);
 }
 
 NativeWindow Desktop::GetOwner(NativeWindow w) const {
@@ -323,7 +341,8 @@ NativeWindow Desktop::DeepestChildAt(NativeWindow w, PointT global) const {
     NativeWindowRecord const* record = Find(w);
     for (auto it = record->children.rbegin(); it != record->children.rend(); ++it) {
         NativeWindowRecord const* child = Find(*it);
-        if (child->shown && (!child->object || child->object->UI_AreAllParentsVisible()) &&
+        if (child->shown && !(child->exStyle & style::MouseTransparent) &&
+            (!child->object || child->object->UI_AreAllParentsVisible()) &&
             GetWindowRect(*it).Contains(global)) {
             return DeepestChildAt(*it, global);
         }
@@ -360,17 +379,14 @@ void Desktop::Activate(NativeWindow w) {
     BringToFront(w);
     if (!applicationActive_) {
         applicationActive_ = true;
-        for (NativeWindow top : EnumerateWindows()) {
-            if (Find(top)->threadId == CurrentThreadId()) {
-                SendMessage(top, message::ActivateApp, 1, 0);
-            }
-        }
+        SendToOwnWindows(message::ActivateApp, 1);
     }
-    if (w == active_) {
+    if (w == active_ || !IsWindow(w)) {
         return;
     }
     NativeWindow previous = active_;
     active_ = w;
+    lastActive_ = w;
     if (previous) {
         SendCaptionActivation(previous, false, w);
     }
@@ -379,22 +395,36 @@ void Desktop::Activate(NativeWindow w) {
     }
 }
 
+void Desktop::SendToOwnWindows(unsigned msg, std::uintptr_t wParam) {
+    // Handlers may destroy windows: every window is looked up again before it is sent to.
+    for (NativeWindow top : EnumerateWindows()) {
+        NativeWindowRecord const* record = Find(top);
+        if (record && record->threadId == CurrentThreadId()) {
+            SendMessage(top, msg, wParam, 0);
+        }
+    }
+}
+
 void Desktop::SetApplicationActive(bool active) {
     if (active == applicationActive_) {
         return;
     }
-    applicationActive_ = active;
-    for (NativeWindow top : EnumerateWindows()) {
-        if (Find(top)->threadId == CurrentThreadId()) {
-            SendMessage(top, message::ActivateApp, active ? 1 : 0, 0);
-        }
-    }
-    if (active_) {
+    if (!active) {
+        applicationActive_ = false;
+        SendToOwnWindows(message::ActivateApp, 0);
         NativeWindow w = active_;
-        if (!active) {
-            active_ = 0;
+        active_ = 0;
+        if (w && IsWindow(w)) {
+            SendCaptionActivation(w, false, 0);
         }
-        SendCaptionActivation(w, active, 0);
+        return;
+    }
+    // Coming back: the window that was active is active again.
+    if (lastActive_ && IsWindow(lastActive_)) {
+        Activate(lastActive_);
+    } else {
+        applicationActive_ = true;
+        SendToOwnWindows(message::ActivateApp, 1);
     }
 }
 
@@ -440,7 +470,7 @@ WindowPlacement Desktop::GetPlacement(NativeWindow w) const {
         return placement;
     }
     placement.showCmd = static_cast<unsigned>(record->showState);
-    placement.flags = record->showState == ShowState::Maximized ? 2 : 0;
+    placement.flags = record->showState == ShowState::Maximized ? 2 : record->placementFlags;
     placement.minPosition = record->minPosition;
     placement.maxPosition = record->maxPosition;
     placement.normal = record->normalRect;
@@ -453,6 +483,7 @@ void Desktop::SetPlacement(NativeWindow w, WindowPlacement const& placement) {
         return;
     }
     record->normalRect = placement.normal;
+    record->placementFlags = placement.flags;
     record->minPosition = placement.minPosition;
     record->maxPosition = placement.maxPosition;
     RectT target = placement.normal;
@@ -638,8 +669,9 @@ void Desktop::MouseDown(PointT global, int button, int clickCount) {
         }
     }
     unsigned msg = button == 0 ? (clickCount >= 2 ? message::LeftButtonDoubleClick : message::LeftButtonDown)
-                               : message::RightButtonDown;
-    SendMouse(msg, global, button == 0 ? 1 : 2);
+                   : button == 2 ? message::MiddleButtonDown
+                                 : message::RightButtonDown;
+    SendMouse(msg, global, button == 0 ? 1 : button == 2 ? 0x10 : 2);
 }
 
 void Desktop::MouseUp(PointT global, int button) {
@@ -649,7 +681,10 @@ void Desktop::MouseUp(PointT global, int button) {
         EndChromeDrag();
         return;
     }
-    SendMouse(button == 0 ? message::LeftButtonUp : message::RightButtonUp, global, 0);
+    SendMouse(button == 0   ? message::LeftButtonUp
+              : button == 2 ? message::MiddleButtonUp
+                            : message::RightButtonUp,
+              global, 0);
 }
 
 void Desktop::MouseWheel(PointT global, int delta) {
@@ -673,7 +708,7 @@ void Desktop::KeyUp(unsigned keyCode) {
 void Desktop::InstallTimer(UI_Node* node, unsigned long id, double seconds, bool repeat) {
     RemoveTimer(node, id);
     double interval = std::max(seconds, 0.0);
-    timers_.push_back(Timer{now_ + interval, ++sequence_, node, id, interval, repeat});
+    timers_.push_back(Timer{now_.load() + interval, ++sequence_, node, id, interval, repeat});
 }
 
 void Desktop::RemoveTimer(UI_Node* node, unsigned long id) {
@@ -695,43 +730,43 @@ bool Desktop::HasTimer(UI_Node const* node, unsigned long id) const {
 
 void Desktop::PostToMainThread(std::function<void()> call, double delaySeconds) {
     std::lock_guard<std::mutex> lock(queueMutex_);
-    queue_.push_back(QueuedCall{now_ + std::max(delaySeconds, 0.0), ++sequence_, std::move(call)});
+    queue_.push_back(QueuedCall{now_.load() + std::max(delaySeconds, 0.0), ++callSequence_, std::move(call)});
 }
 
-bool Desktop::RunNextDue(double until) {
+bool Desktop::RunNextDue(double until, unsigned long newestCall) {
     // The earliest due timer or call (by due time, then by when it was made).
     auto timer = std::min_element(timers_.begin(), timers_.end(), [](Timer const& a, Timer const& b) {
         return a.due < b.due || (a.due == b.due && a.sequence < b.sequence);
     });
     std::function<void()> call;
     double callDue = 0;
-    unsigned long callSequence = 0;
     {
         std::lock_guard<std::mutex> lock(queueMutex_);
-        auto next =
-            std::min_element(queue_.begin(), queue_.end(), [](QueuedCall const& a, QueuedCall const& b) {
-                return a.due < b.due || (a.due == b.due && a.sequence < b.sequence);
-            });
-        bool callFirst = next != queue_.end() && next->due <= until &&
-                         (timer == timers_.end() || next->due < timer->due ||
-                          (next->due == timer->due && next->sequence < timer->sequence));
+        // Only calls queued before this turn began are eligible; later ones wait for the next turn.
+        auto next = queue_.end();
+        for (auto it = queue_.begin(); it != queue_.end(); ++it) {
+            if (it->sequence <= newestCall && (next == queue_.end() || it->due < next->due ||
+                                               (it->due == next->due && it->sequence < next->sequence))) {
+                next = it;
+            }
+        }
+        bool callFirst =
+            next != queue_.end() && next->due <= until && (timer == timers_.end() || next->due <= timer->due);
         if (callFirst) {
             callDue = next->due;
-            callSequence = next->sequence;
             call = std::move(next->call);
             queue_.erase(next);
         }
     }
-    (void)callSequence;
     if (call) {
-        now_ = std::max(now_, callDue);
+        now_ = std::max(now_.load(), callDue);
         call();
         return true;
     }
     if (timer == timers_.end() || timer->due > until) {
         return false;
     }
-    now_ = std::max(now_, timer->due);
+    now_ = std::max(now_.load(), timer->due);
     UI_Node* node = timer->node;
     unsigned long id = timer->id;
     if (timer->repeat) {
@@ -746,15 +781,22 @@ bool Desktop::RunNextDue(double until) {
     return true;
 }
 
+unsigned long Desktop::NewestCall() {
+    std::lock_guard<std::mutex> lock(queueMutex_);
+    return callSequence_;
+}
+
 void Desktop::AdvanceTime(double seconds) {
-    double until = now_ + std::max(seconds, 0.0);
-    while (RunNextDue(until)) {
+    double until = now_.load() + std::max(seconds, 0.0);
+    unsigned long newest = NewestCall();
+    while (RunNextDue(until, newest)) {
     }
     now_ = until;
 }
 
 void Desktop::ProcessPendingWork() {
-    while (RunNextDue(now_)) {
+    unsigned long newest = NewestCall();
+    while (RunNextDue(now_.load(), newest)) {
     }
 }
 

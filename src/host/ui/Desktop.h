@@ -10,7 +10,11 @@
 // - A window with a caption has a 22-pixel title bar and 3-pixel borders; one created with a menu
 //   also has a 20-pixel menu bar. Popups and child windows have no chrome.
 // - A top-level window that is mouse-transparent, or layered with opacity below 1.0, is skipped when
-//   looking for the window under a point; so are hidden and disabled windows' children.
+//   looking for the window under a point, and so is a hidden or mouse-transparent child window.
+// - Handles are never reused in a process, even across Reset, so an object that outlives a desktop
+//   cannot destroy a window of the next one.
+// - Queued calls posted while queued calls run wait for the next turn, so a call that posts itself
+//   cannot hang the loop; timers repeat at most once a millisecond.
 // - A press in a caption moves the window until the release; a press in a border resizes it; the
 //   node manager's user-resize function hears the beginning and the end of either.
 // - Timers and delayed calls run in due-time order (install order among equals) as time advances.
@@ -19,6 +23,7 @@
 #include "host/ui/Events.h"
 #include "host/ui/canvasor/Image.h"
 
+#include <atomic>
 #include <functional>
 #include <map>
 #include <memory>
@@ -61,6 +66,8 @@ struct NativeWindowRecord {
     bool captionActive = false;
     bool dirty = true;
     ShowState showState = ShowState::Normal;
+    // Placement flags: 2 restores a minimised window to maximised.
+    unsigned placementFlags = 0;
     RectT normalRect;
     PointT minPosition;
     PointT maxPosition;
@@ -97,6 +104,8 @@ public:
     void SetObject(NativeWindow w, OS_Window* object);
     OS_Window* GetObject(NativeWindow w) const;
     NativeWindow GetParent(NativeWindow w) const;
+    // Moves a child window under another parent window (its node moved in the tree).
+    void SetParent(NativeWindow child, NativeWindow parent);
     NativeWindow GetOwner(NativeWindow w) const;
     std::uint32_t GetStyle(NativeWindow w) const;
     std::uint32_t GetExStyle(NativeWindow w) const;
@@ -181,7 +190,7 @@ public:
     int GetCursor() const { return cursor_; }
 
     // --- Time, timers and queued calls ---
-    double Now() const { return now_; }
+    double Now() const { return now_.load(); }
     // Moves time forward, firing due timers and delayed calls in time order.
     void AdvanceTime(double seconds);
     // Runs the queued calls that are due now (those queued meanwhile included).
@@ -219,18 +228,22 @@ private:
     NativeWindow DeepestChildAt(NativeWindow w, PointT global) const;
     void LiftOwned(NativeWindow owner);
     void SendCaptionActivation(NativeWindow w, bool active, NativeWindow other);
+    void SendToOwnWindows(unsigned message, std::uintptr_t wParam);
+    unsigned long NewestCall();
     // Mouse messages to the capturing window or the one under the pointer.
     void SendMouse(unsigned message, PointT global, std::uintptr_t wParam, std::intptr_t extra = 0);
     bool StartChromeDrag(NativeWindow w, PointT global);
     void ContinueChromeDrag(PointT global);
     void EndChromeDrag();
-    bool RunNextDue(double until);
+    bool RunNextDue(double until, unsigned long newestCall);
 
     std::vector<RectT> monitors_;
     std::map<NativeWindow, NativeWindowRecord> records_;
     std::vector<NativeWindow> zOrder_; // top-level windows, bottom to top
-    NativeWindow nextHandle_ = 0x100;
+    static inline NativeWindow nextHandle_ = 0x100;
     NativeWindow active_ = 0;
+    // The window to activate again when the application returns to the front.
+    NativeWindow lastActive_ = 0;
     NativeWindow capture_ = 0;
     bool applicationActive_ = false;
     int beeps_ = 0;
@@ -238,8 +251,9 @@ private:
     unsigned modifiers_ = 0;
     bool buttonDown_ = false;
     int cursor_ = 0;
-    double now_ = 0;
+    std::atomic<double> now_{0};
     unsigned long sequence_ = 0;
+    unsigned long callSequence_ = 0;
     std::vector<Timer> timers_;
     std::mutex queueMutex_;
     std::vector<QueuedCall> queue_;

@@ -80,7 +80,10 @@ void Desktop::PaintWindow(NativeWindow w) {
         }
         RectF clientArea(float(client.left - r.left), float(client.top - r.top), float(client.width),
                          float(client.height));
-        c.FillRect(clientArea, GetColor(color::WindowBackground));
+        // A layered window (an overlay) shows only what it draws; the rest lets the windows beneath show.
+        if (!(record->exStyle & style::Layered)) {
+            c.FillRect(clientArea, GetColor(color::WindowBackground));
+        }
         if (record->object) {
             c.Save();
             c.Translate(clientArea.left, clientArea.top);

@@ -1,6 +1,6 @@
 // Captures of input: an InputCapture sees mouse and key events before any node (a pop-up that closes
 // when clicked outside, a delayed press); a PointerCapture sends every mouse event to one node for
-// its lifetime (a control being dragged).
+// its lifetime (a control being dragged), its window holding the mouse capture meanwhile.
 #pragma once
 
 #include "host/ui/UI_Node.h"
@@ -26,6 +26,8 @@ public:
 
 private:
     UI_Node* previous_;
+    NativeWindow window_ = 0;
+    NativeWindow previousCapture_ = 0;
 };
 
 // The pointer's global position and the modifier flags held (see orvui::ui::modifier).

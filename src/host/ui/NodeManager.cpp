@@ -16,14 +16,32 @@ UI_NodeManager* current = nullptr;
 
 class DefaultNodeManager : public OS_NodeManager {};
 
-// The node and its ancestors, nearest first, as owning pointers so notifications cannot free them.
-std::vector<boost::intrusive_ptr<UI_Node>> Chain(UI_Node* node) {
-    std::vector<boost::intrusive_ptr<UI_Node>> chain;
-    for (UI_Node* n = node; n; n = n->UI_GetParentNode()) {
-        chain.emplace_back(n);
+// The node and its ancestors, nearest first, kept alive while events and notifications run through
+// them (a handler may remove a node from the tree). Nodes no intrusive pointer owns are left as they
+// are: taking a reference would free them when it ends.
+class Chain {
+public:
+    explicit Chain(UI_Node* node, bool stopAtTopLevel = false) {
+        for (UI_Node* n = node; n; n = n->UI_GetParentNode()) {
+            nodes_.push_back(n);
+            if (n->IsReferenced()) {
+                keep_.emplace_back(n);
+            }
+            if (stopAtTopLevel) {
+                if (OS_Window* w = n->UI_GetOSWindow(); w && w->IsTopLevel()) {
+                    break;
+                }
+            }
+        }
     }
-    return chain;
-}
+    std::vector<UI_Node*>::const_iterator begin() const { return nodes_.begin(); }
+    std::vector<UI_Node*>::const_iterator end() const { return nodes_.end(); }
+    bool Contains(UI_Node* n) const { return std::find(nodes_.begin(), nodes_.end(), n) != nodes_.end(); }
+
+private:
+    std::vector<UI_Node*> nodes_;
+    std::vector<boost::intrusive_ptr<UI_Node>> keep_;
+};
 
 } // namespace
 
@@ -138,19 +156,16 @@ void UI_NodeManager::Notify(UI_Node* from, UI_Node* to, int reason) {
     if (from == to) {
         return;
     }
-    auto lost = Chain(from);
-    auto gained = Chain(to);
-    auto contains = [](std::vector<boost::intrusive_ptr<UI_Node>> const& chain, UI_Node* n) {
-        return std::any_of(chain.begin(), chain.end(), [&](auto const& p) { return p.get() == n; });
-    };
+    Chain lost(from);
+    Chain gained(to);
     ++updatingFocus_;
-    for (auto const& n : lost) {
-        if (!contains(gained, n.get())) {
+    for (UI_Node* n : lost) {
+        if (!gained.Contains(n)) {
             n->UI_FocusChanged(reason);
         }
     }
-    for (auto const& n : gained) {
-        if (!contains(lost, n.get())) {
+    for (UI_Node* n : gained) {
+        if (!lost.Contains(n)) {
             n->UI_FocusChanged(reason);
         }
     }
@@ -204,6 +219,15 @@ void UI_NodeManager::DispatchMouse(OS_Window& window, OS_Event const& event) {
         act = action::Release;
         button = 1;
         break;
+    case message::MiddleButtonDown:
+        act = action::SecondaryPress;
+        button = 2;
+        clicks = 1;
+        break;
+    case message::MiddleButtonUp:
+        act = action::Release;
+        button = 2;
+        break;
     case message::MouseWheel:
         act = action::Wheel;
         wheel = static_cast<int>(static_cast<std::int16_t>(event.wParam >> 16));
@@ -218,13 +242,15 @@ void UI_NodeManager::DispatchMouse(OS_Window& window, OS_Event const& event) {
             return;
         }
     }
-    boost::intrusive_ptr<UI_Node> target(pointerCapture_ ? pointerCapture_ : HitTest(&window, global));
+    UI_Node* target = pointerCapture_ ? pointerCapture_ : HitTest(&window, global);
     if (!target) {
         return;
     }
-    if (act == action::Move) {
+    Chain chain(target);
+    // While the mouse is captured (a drag) the capturer owns the cursor.
+    if (act == action::Move && !desktop.GetCapture()) {
         bool set = false;
-        for (auto const& n : Chain(target.get())) {
+        for (UI_Node* n : chain) {
             if (n->UI_DoCursor(n->UI_GlobalToLocalF(PointF(float(global.x), float(global.y))))) {
                 set = true;
                 break;
@@ -235,15 +261,15 @@ void UI_NodeManager::DispatchMouse(OS_Window& window, OS_Event const& event) {
         }
     }
     if (act == action::Press || act == action::SecondaryPress || act == action::DoubleClickPress) {
-        for (auto const& n : Chain(target.get())) {
+        for (UI_Node* n : chain) {
             if (n->UI_DoMouseActivate()) {
                 break;
             }
         }
     }
-    for (auto const& n : Chain(target.get())) {
+    for (UI_Node* n : chain) {
         mouse.SetLocalPoint(n->UI_GlobalToLocalF(PointF(float(global.x), float(global.y))));
-        if (n->UI_DoMouseEvent(target.get(), mouse)) {
+        if (n->UI_DoMouseEvent(target, mouse)) {
             break;
         }
     }
@@ -259,11 +285,23 @@ void UI_NodeManager::DispatchKey(KeyboardEvent& event) {
     if (!start) {
         start = Desktop::Get().GetObject(Desktop::Get().GetActiveWindow());
     }
-    for (auto const& n : Chain(start)) {
+    // Keys bubble up to the top-level window and no further.
+    for (UI_Node* n : Chain(start, true)) {
         if (n->UI_DoKeyboardEvent(event)) {
             break;
         }
     }
+}
+
+void UI_NodeManager::ResetState() {
+    focus_ = nullptr;
+    focusAtGroupStart_ = nullptr;
+    grouping_ = 0;
+    pointerCapture_ = nullptr;
+    modal_ = nullptr;
+    inputCapture_.reset();
+    userResize_ = nullptr;
+    mouseOverSuspended_ = 0;
 }
 
 void UI_NodeManager::ForgetNode(UI_Node* node) {
@@ -284,10 +322,28 @@ void UI_NodeManager::ForgetNode(UI_Node* node) {
 PointerCapture::PointerCapture(UI_Node* node)
     : previous_(UI_NodeManager::Get()->GetPointerCaptureNode()) {
     UI_NodeManager::Get()->SetPointerCaptureNode(node);
+    // The node's top-level window takes the mouse, so a release anywhere still reaches the node.
+    OS_Window* w = node ? node->UI_GetContainingWindow() : nullptr;
+    while (w && !w->IsTopLevel() && w->UI_GetParentNode()) {
+        w = w->UI_GetParentNode()->UI_GetContainingWindow();
+    }
+    if (w && w->GetPlatformWindow()) {
+        window_ = w->GetPlatformWindow();
+        previousCapture_ = Desktop::Get().GetCapture();
+        Desktop::Get().SetCapture(window_);
+    }
 }
 
 PointerCapture::~PointerCapture() {
     UI_NodeManager::Get()->SetPointerCaptureNode(previous_);
+    Desktop& desktop = Desktop::Get();
+    if (window_ && desktop.GetCapture() == window_) {
+        if (previousCapture_ && desktop.IsWindow(previousCapture_)) {
+            desktop.SetCapture(previousCapture_);
+        } else {
+            desktop.ReleaseCapture();
+        }
+    }
 }
 
 PointT GetGlobalMousePosition() {

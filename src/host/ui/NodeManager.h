@@ -117,6 +117,8 @@ public:
 
     // A node is going away.
     void ForgetNode(UI_Node* node);
+    // Back to no focus, no captures, no modal window and no user-resize function (a fresh desktop).
+    void ResetState();
 
 protected:
     UI_NodeManager();

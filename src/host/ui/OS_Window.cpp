@@ -30,8 +30,11 @@ NativeWindow OS_Window::UI_CreateWindow(std::u16string const& title, NativeWindo
 
 void OS_Window::UI_AttachWindow(NativeWindow window) {
     Desktop& desktop = Desktop::Get();
-    if (!desktop.IsWindow(window)) {
+    if (!desktop.IsWindow(window) || window == window_) {
         return;
+    }
+    if (window_) {
+        UI_DetachOSWindow();
     }
     window_ = window;
     desktop.SetObject(window, this);
@@ -73,7 +76,21 @@ void OS_Window::UI_HandleOSEvent(OS_Event& event) {
 }
 
 bool OS_Window::IsTopLevel() const {
-    return window_ && !(Desktop::Get().GetStyle(window_) & style::Child);
+    Desktop& desktop = Desktop::Get();
+    return window_ && desktop.IsWindow(window_) && !(desktop.GetStyle(window_) & style::Child);
+}
+
+void OS_Window::UI_ParentChanged() {
+    Desktop& desktop = Desktop::Get();
+    if (!window_ || !(desktop.GetStyle(window_) & style::Child)) {
+        return;
+    }
+    for (UI_Node* n = UI_GetParentNode(); n; n = n->UI_GetParentNode()) {
+        if (OS_Window* w = n->UI_GetOSWindow(); w && w->GetPlatformWindow()) {
+            desktop.SetParent(window_, w->GetPlatformWindow());
+            return;
+        }
+    }
 }
 
 RectT OS_Window::UI_GetGlobalStructureRect() const {

@@ -55,6 +55,10 @@ public:
 
     // The desktop moved or resized the native window: the node follows.
     void NativeRectChanged();
+    // The native window is gone (destroyed, or its desktop reset): the node forgets it.
+    void NativeDestroyed() { window_ = 0; }
+    // A child window's node moved: its native window follows it under the new parent window.
+    void UI_ParentChanged() override;
 
 private:
     NativeWindow window_ = 0;

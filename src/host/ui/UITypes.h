@@ -42,6 +42,8 @@ inline constexpr unsigned LeftButtonUp = 0x202;
 inline constexpr unsigned LeftButtonDoubleClick = 0x203;
 inline constexpr unsigned RightButtonDown = 0x204;
 inline constexpr unsigned RightButtonUp = 0x205;
+inline constexpr unsigned MiddleButtonDown = 0x207;
+inline constexpr unsigned MiddleButtonUp = 0x208;
 inline constexpr unsigned MouseWheel = 0x20A;
 inline constexpr unsigned CaptureLost = 0x215;
 } // namespace message

@@ -38,7 +38,20 @@ std::vector<UI_Node*> UI_Node::UI_GetNodeParents() const {
     return parents;
 }
 
+bool UI_Node::IsAncestorOf(UI_Node const* node) const {
+    for (UI_Node const* n = node; n; n = n->parent_) {
+        if (n == this) {
+            return true;
+        }
+    }
+    return false;
+}
+
 void UI_Node::Attach(UI_Node* child, std::size_t index) {
+    // A node cannot go below itself: that would make the tree a cycle.
+    if (child->IsAncestorOf(this)) {
+        return;
+    }
     // Keep the child alive while it leaves its old parent.
     boost::intrusive_ptr<UI_Node> keep(child);
     if (child->parent_) {
@@ -47,18 +60,19 @@ void UI_Node::Attach(UI_Node* child, std::size_t index) {
     index = std::min(index, children_.size());
     children_.insert(children_.begin() + long(index), keep);
     child->parent_ = this;
+    child->UI_ParentChanged();
     ChildAdded(child);
     UI_Invalidate();
 }
 
 void UI_Node::ChildPushBack(boost::intrusive_ptr<UI_Node> child) {
-    if (child && child.get() != this) {
+    if (child) {
         Attach(child.get(), children_.size());
     }
 }
 
 void UI_Node::ChildInsert(std::size_t index, boost::intrusive_ptr<UI_Node> child) {
-    if (child && child.get() != this) {
+    if (child) {
         Attach(child.get(), index);
     }
 }
@@ -72,6 +86,7 @@ bool UI_Node::ChildRemove(UI_Node* child) {
     boost::intrusive_ptr<UI_Node> keep = *it;
     children_.erase(it);
     child->parent_ = nullptr;
+    child->UI_ParentChanged();
     ChildRemoved(child);
     UI_Invalidate();
     return true;

@@ -1,7 +1,9 @@
 // The toolkit's node: a reference-counted element of the user interface with a parent, ordered
 // children, an identifier, a rectangle in its parent's coordinates, shown state and opacity, and the
 // virtual operations through which it draws and reacts to input, focus, activation and timers.
-// Children are owned by their parent through intrusive pointers; the parent link is plain.
+// Children are owned by their parent through intrusive pointers; the parent link is plain. Nodes are
+// meant to live in intrusive pointers; one held otherwise (on the stack, by value) is never kept
+// alive or freed by the toolkit.
 #pragma once
 
 #include "host/ui/Events.h"
@@ -56,6 +58,12 @@ public:
     std::size_t ChildIndex(UI_Node const* child) const;
     // The first node below (or this one) with the identifier, depth first.
     UI_Node* UI_FindNodeByID(std::string const& id);
+    // This node was attached to a parent or taken out of one.
+    virtual void UI_ParentChanged() {}
+    // Whether an intrusive pointer owns this node (the toolkit only keeps such nodes alive itself).
+    bool IsReferenced() const { return refs_ > 0; }
+    // Whether node is this one or below it.
+    bool IsAncestorOf(UI_Node const* node) const;
     virtual void ChildAdded(UI_Node*) {}
     virtual void ChildRemoved(UI_Node*) {}
     virtual void ChildOrderChanged() {}
