@@ -366,7 +366,7 @@ NativeWindow Desktop::WindowFromPoint(PointT global) const {
 void Desktop::SendCaptionActivation(NativeWindow w, bool active, NativeWindow other) {
     SendMessage(w, message::CaptionActivate, active ? 1 : 0, static_cast<std::intptr_t>(other));
     if (OS_Window* object = GetObject(w)) {
-        boost::intrusive_ptr<UI_Node> keep(object);
+        boost::intrusive_ptr<UI_Node> keep(object->IsReferenced() ? object : nullptr);
         object->UI_ActivationChanged(active);
     }
 }
@@ -546,7 +546,7 @@ std::intptr_t Desktop::SendMessage(NativeWindow w, unsigned msg, std::uintptr_t 
     if (!object) {
         return 0;
     }
-    boost::intrusive_ptr<UI_Node> keep(object);
+    boost::intrusive_ptr<UI_Node> keep(object->IsReferenced() ? object : nullptr);
     OS_Event event;
     event.window = w;
     event.message = msg;
@@ -776,7 +776,7 @@ bool Desktop::RunNextDue(double until, unsigned long newestCall) {
     } else {
         timers_.erase(timer);
     }
-    boost::intrusive_ptr<UI_Node> keep(node);
+    boost::intrusive_ptr<UI_Node> keep(node->IsReferenced() ? node : nullptr);
     node->UI_DoTimerNotify(id);
     return true;
 }

@@ -31,7 +31,7 @@ void UI_ModalWindow::EndModal(int result) {
 }
 
 int UI_ModalWindow::RunModal() {
-    boost::intrusive_ptr<UI_Node> keep(this);
+    boost::intrusive_ptr<UI_Node> keep(IsReferenced() ? this : nullptr);
     Desktop& desktop = Desktop::Get();
     UI_NodeManager* manager = UI_NodeManager::Get();
     done_ = false;
@@ -46,7 +46,8 @@ int UI_ModalWindow::RunModal() {
     manager->SetModalWindow(this);
     UI_Show(true);
     desktop.Activate(self);
-    UI_GainKeyboardFocus(FocusByProgram);
+    (initialFocus_ && IsAncestorOf(initialFocus_) ? initialFocus_ : this)
+        ->UI_GainKeyboardFocus(FocusByProgram);
     for (int turn = 0; !done_; ++turn) {
         if (!driver || turn >= MaxTurns) {
             CancelModal();

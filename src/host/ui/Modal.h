@@ -22,6 +22,8 @@ public:
     void SetCancelResult(int result) { cancelResult_ = result; }
     int GetCancelResult() const { return cancelResult_; }
     virtual void CancelModal() { EndModal(cancelResult_); }
+    // The node that takes the keyboard focus when the loop starts (the window itself by default).
+    void SetInitialFocus(UI_Node* node) { initialFocus_ = node; }
 
     // Shows the window, runs the loop until it ends, hides it, and returns the result.
     int RunModal();
@@ -30,6 +32,7 @@ private:
     bool done_ = false;
     int result_ = 0;
     int cancelResult_ = 0;
+    UI_Node* initialFocus_ = nullptr;
 };
 
 // Called on each turn of a modal loop with the modal window.

@@ -140,7 +140,8 @@ UI_TabWell::UI_TabWell(TabActionCallback callback)
 
 void UI_TabWell::Report(int action, long index, RectT const* rect) {
     if (callback_) {
-        boost::intrusive_ptr<ui::UI_Node> keep(this); // a handler may take the well out of its frame
+        boost::intrusive_ptr<ui::UI_Node> keep(
+            IsReferenced() ? this : nullptr); // a handler may take the well out of its frame
         callback_(action, index, rect);
     }
 }
@@ -597,7 +598,7 @@ bool UI_TablessDragger::UI_DoMouseEvent(ui::UI_Node*, ui::MouseEvent& event) {
         return false;
     }
     RectT rect = UI_GetGlobalRect();
-    boost::intrusive_ptr<ui::UI_Node> keep(this);
+    boost::intrusive_ptr<ui::UI_Node> keep(IsReferenced() ? this : nullptr);
     callback_(0, 0, &rect);
     return true;
 }
