@@ -181,6 +181,8 @@ TEST_F(DesktopTest, MonitorsByIndexPointAndVisibility) {
     RectT lost(5000, 2000, 300, 200);
     EXPECT_TRUE(monitors.EnsureRectIsVisible(lost));
     EXPECT_EQ(lost, RectT(2900, 824, 300, 200));
+    EXPECT_TRUE(monitors.GetMonitorRectFromRect(RectT(1800, 100, 400, 300), r));
+    EXPECT_EQ(r.left, 1920); // most of it lies on the second monitor
     RectT fine(10, 10, 300, 200);
     EXPECT_FALSE(monitors.EnsureRectIsVisible(fine));
 }

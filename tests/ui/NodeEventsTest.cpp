@@ -323,3 +323,22 @@ TEST_F(NodeTest, KeysGoToTheFocusOrTheActiveWindowAndStopThere) {
     keyed.reset();
     host->DeleteChildren();
 }
+
+TEST_F(NodeTest, AContainerCanKeepFocusAmongItsChildren) {
+    struct Frame : UI_Container {
+        bool UI_WantsKeyboardFocus() const override { return false; }
+        bool AllowFocusToAdvanceFromChildren() const override { return false; }
+    };
+    boost::intrusive_ptr<Frame> frame(new Frame);
+    window->ChildPushBack(frame);
+    frame->UI_SetRect(RectF(0, 150, 200, 100));
+    boost::intrusive_ptr<RecordingNode> a(new RecordingNode("a", &log)), b(new RecordingNode("b", &log));
+    frame->ChildPushBack(a);
+    frame->ChildPushBack(b);
+    a->UI_GainKeyboardFocus(FocusByProgram);
+    KeyboardEvent tab(key::Tab, true, 0);
+    EXPECT_TRUE(window->UI_DoAdvanceKeyboardFocus(tab));
+    EXPECT_EQ(UI_Node::UI_GetKeyboardFocusLeafNode(), b.get());
+    EXPECT_TRUE(window->UI_DoAdvanceKeyboardFocus(tab)); // wraps within the frame, never to outer
+    EXPECT_EQ(UI_Node::UI_GetKeyboardFocusLeafNode(), a.get());
+}

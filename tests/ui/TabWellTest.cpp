@@ -159,6 +159,11 @@ TEST_F(TabWellTest, HoverLockAndMultiPaneMarks) {
     Desktop::Get().MouseMove(PointT(103 + 300, 125 + 10)); // past the items
     EXPECT_EQ(actions, (std::vector<std::string>{"6:0", "6:1", "6:-1"}));
     actions.clear();
+    {
+        UI_NodeManager::SuspendMouseOverUpdates frozen; // a drag freezes hover feedback
+        Desktop::Get().MouseMove(InTab(2));
+        EXPECT_TRUE(actions.empty());
+    }
     well->SetLockable(1, true);
     well->SetMultitab(1, true);
     UI_TabItem* item = well->GetTab(1);

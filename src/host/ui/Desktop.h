@@ -120,6 +120,11 @@ public:
     RectT GetWindowRect(NativeWindow w) const;
     // The global client rectangle (chrome excluded).
     RectT GetClientRect(NativeWindow w) const;
+    // A point in a window's client coordinates, in global ones.
+    PointT ClientToGlobal(NativeWindow w, PointT client) const {
+        RectT r = GetClientRect(w);
+        return PointT(r.left + client.x, r.top + client.y);
+    }
     // Moves and resizes a top-level window (its structure rectangle); its object hears of it.
     void SetWindowRect(NativeWindow w, RectT const& rect);
     void ShowWindow(NativeWindow w, bool show);

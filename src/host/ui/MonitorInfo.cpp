@@ -44,6 +44,20 @@ bool MonitorInfo::GetMonitorRectFromPoint(PointT const& point, RectT& out) const
     return true;
 }
 
+bool MonitorInfo::GetMonitorRectFromRect(RectT const& rect, RectT& out) const {
+    long long best = 0;
+    for (RectT const& m : monitors_) {
+        RectT common = m.Intersection(rect);
+        long long area = (long long)common.width * common.height;
+        if (area > best) {
+            best = area;
+            out = m;
+        }
+    }
+    return best > 0 ||
+           GetMonitorRectFromPoint(PointT(rect.left + rect.width / 2, rect.top + rect.height / 2), out);
+}
+
 bool MonitorInfo::EnsureRectIsVisible(RectT& rect) const {
     RectT titleStrip(rect.left, rect.top, rect.width,
                      std::min<std::int32_t>(rect.height, ui::TitleBarHeight));

@@ -27,6 +27,8 @@ public:
     bool GetMonitorRect(std::size_t index, RectT& out) const;
     // The monitor holding the point, else the one nearest to it.
     bool GetMonitorRectFromPoint(PointT const& point, RectT& out) const;
+    // The monitor that shares the most area with rect (the nearest to its middle when none does).
+    bool GetMonitorRectFromRect(RectT const& rect, RectT& out) const;
     // Moves rect onto the monitor nearest to it when its top strip (where a title bar is) is on no
     // monitor; a rectangle larger than that monitor keeps its size and goes to its top-left corner.
     // Returns whether it moved.

@@ -4,6 +4,7 @@
 #include "host/ui/Desktop.h"
 #include "host/ui/NodeManager.h"
 #include "host/ui/OS_Window.h"
+#include "host/ui/UI_Container.h"
 
 #include <algorithm>
 #include <cmath>
@@ -267,11 +268,22 @@ bool UI_Node::UI_DoAdvanceKeyboardFocus(KeyboardEvent& event) {
     if (event.GetKeyCode() != key::Tab || !event.IsKeyDown()) {
         return false;
     }
+    // Focus moves within the top-level window, or within the nearest container around the focus
+    // that keeps it among its children.
     UI_Node* root = this;
     for (UI_Node* n = this; n; n = n->parent_) {
         root = n;
         if (OS_Window* w = n->UI_GetOSWindow(); w && w->IsTopLevel()) {
             break;
+        }
+    }
+    if (UI_Node* leaf = UI_GetKeyboardFocusLeafNode(); leaf && root->IsAncestorOf(leaf)) {
+        for (UI_Node* n = leaf->parent_; n && n != root; n = n->parent_) {
+            auto* container = dynamic_cast<UI_Container*>(n);
+            if (container && !container->AllowFocusToAdvanceFromChildren()) {
+                root = n;
+                break;
+            }
         }
     }
     std::vector<UI_Node*> focusable;

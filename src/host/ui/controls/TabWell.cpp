@@ -409,7 +409,8 @@ bool UI_TabWell::UI_DoMouseEvent(ui::UI_Node*, ui::MouseEvent& event) {
     bool overFlyout = flyout->UI_HitTest(inFlyout);
     long index = overFlyout ? -1 : GetTabIndexFromPoint(local);
     if (event.IsAction(action::Move)) {
-        if (index != hover_) {
+        // Hover feedback stays as it is while a drag freezes it.
+        if (index != hover_ && !ui::UI_NodeManager::Get()->MouseOverUpdatesSuspended()) {
             hover_ = index;
             Report(TabHoverChanged, index);
             UI_Invalidate();
