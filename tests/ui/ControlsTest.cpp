@@ -35,24 +35,15 @@ void Type(std::u16string const& text) {
     }
 }
 
-// A driver that runs its steps one per turn; later turns do nothing.
 ModalDriver Steps(std::vector<std::function<void(UI_ModalWindow&)>> steps) {
-    auto shared = std::make_shared<std::vector<std::function<void(UI_ModalWindow&)>>>(std::move(steps));
-    auto turn = std::make_shared<std::size_t>(0);
-    return [shared, turn](UI_ModalWindow& modal) {
-        if (*turn < shared->size()) {
-            (*shared)[(*turn)++](modal);
-        }
-    };
+    return orvtest::Steps<UI_ModalWindow>(std::move(steps));
 }
 
 class ControlsTest : public DesktopScenario {
 protected:
     void SetUp() override {
         DesktopScenario::SetUp();
-        window = new RecordingWindow;
-        window->UI_CreateWindow(u"controls", 0, RectT(100, 100, 506, 428),
-                                style::Popup | style::Caption | style::SizingFrame | style::Visible, 0);
+        window = MakeCaptionWindow(u"controls", RectT(100, 100, 506, 428));
     }
     void CloseWindows() override {
         window->DeleteChildren();

@@ -76,11 +76,8 @@ protected:
         left.reset();
         right.reset();
     }
-    boost::intrusive_ptr<RecordingWindow> MakeWindow(RectT rect) {
-        boost::intrusive_ptr<RecordingWindow> w(new RecordingWindow);
-        w->UI_CreateWindow(u"example", 0, rect,
-                           style::Popup | style::Caption | style::SizingFrame | style::Visible, 0);
-        return w;
+    static boost::intrusive_ptr<RecordingWindow> MakeWindow(RectT rect) {
+        return MakeCaptionWindow(u"example", rect);
     }
     // What the user sees at a point of a window's client area.
     ColorRGBA SeenAt(boost::intrusive_ptr<RecordingWindow> const& w, int x, int y) {

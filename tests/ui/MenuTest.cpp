@@ -22,15 +22,8 @@ protected:
         menu.AppendItem(u"Disabled", 103, false);
         menu.AppendItem(u"Reset Workspace...", 104);
     }
-    // A driver that runs the given steps, one per turn, on the open menu.
     static orvui::ui::ModalDriver Steps(std::vector<std::function<void(MenuWindow&)>> steps) {
-        auto shared = std::make_shared<std::vector<std::function<void(MenuWindow&)>>>(std::move(steps));
-        auto turn = std::make_shared<std::size_t>(0);
-        return [shared, turn](orvui::ui::UI_ModalWindow& modal) {
-            if (*turn < shared->size()) {
-                (*shared)[(*turn)++](static_cast<MenuWindow&>(modal));
-            }
-        };
+        return orvtest::Steps<MenuWindow>(std::move(steps));
     }
     static void ClickItem(MenuWindow& m, std::size_t position) {
         RectT r = m.GetItemGlobalRect(position);

@@ -18,9 +18,7 @@ class TabWellTest : public DesktopScenario {
 protected:
     void SetUp() override {
         DesktopScenario::SetUp();
-        window = new RecordingWindow;
-        window->UI_CreateWindow(u"tabs", 0, RectT(100, 100, 406, 328),
-                                style::Popup | style::Caption | style::SizingFrame | style::Visible, 0);
+        window = MakeCaptionWindow(u"tabs", RectT(100, 100, 406, 328));
         well = new UI_TabWell([this](int action, long index, RectT const* rect) {
             actions.push_back(std::to_string(action) + ":" + std::to_string(index));
             lastRect = rect ? *rect : RectT();

@@ -2,10 +2,13 @@
 #pragma once
 
 #include "host/ui/Desktop.h"
+#include "host/ui/Modal.h"
 #include "host/ui/NodeManager.h"
 #include "host/ui/OS_Window.h"
 
+#include <functional>
 #include <gtest/gtest.h>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -76,6 +79,25 @@ public:
     bool consumesKeys = false;
     int cursorToSet = -1;
 };
+
+// A modal driver that runs one step per turn of the loop; later turns do nothing.
+template <typename Modal = UI_ModalWindow> ModalDriver Steps(std::vector<std::function<void(Modal&)>> steps) {
+    auto shared = std::make_shared<std::vector<std::function<void(Modal&)>>>(std::move(steps));
+    auto turn = std::make_shared<std::size_t>(0);
+    return [shared, turn](UI_ModalWindow& modal) {
+        if (*turn < shared->size()) {
+            (*shared)[(*turn)++](dynamic_cast<Modal&>(modal));
+        }
+    };
+}
+
+// A shown top-level window with a caption and a sizing frame.
+inline boost::intrusive_ptr<RecordingWindow> MakeCaptionWindow(std::u16string const& title, RectT rect) {
+    boost::intrusive_ptr<RecordingWindow> w(new RecordingWindow);
+    w->UI_CreateWindow(title, 0, rect, style::Popup | style::Caption | style::SizingFrame | style::Visible,
+                       0);
+    return w;
+}
 
 // Gives every toolkit test a fresh desktop.
 class DesktopTest : public ::testing::Test {
