@@ -4,6 +4,7 @@
 
 #include "host/ui/Dialogs.h"
 #include "host/ui/Menu.h"
+#include "host/ui/canvasor/Canvasor.h"
 #include "host/ui/controls/Controls.h"
 #include "host/ui/controls/Popup.h"
 #include "support/SnapshotOnFailure.h"
@@ -16,6 +17,10 @@ using orvui::ui::ScopedModalDriver;
 using orvui::ui::UI_ModalWindow;
 
 namespace {
+
+canvasor::ColorRGBA ColorRGBAOf(float r, float g, float b) {
+    return canvasor::ColorRGBA(r, g, b, 1);
+}
 
 void ClickAt(PointT p, int clicks = 1) {
     Desktop::Get().MouseMove(p);
@@ -285,4 +290,39 @@ TEST_F(ControlsTest, FileOpenDialogListsMatchingFilesAndReturnsTheChoice) {
     ScopedModalDriver none(nullptr);
     EXPECT_FALSE(dialog->RunModal());
     EXPECT_TRUE(dialog->GetFullPath().empty());
+}
+
+TEST_F(ControlsTest, PictureButtonsAskForTheirPicturePerState) {
+    std::vector<unsigned long> asked;
+    auto button = Add(new UI_PictureButton, RectF(10, 10, 20, 20));
+    button->SetPictureSupply([&](unsigned long state) {
+        asked.push_back(state);
+        canvasor::Image picture(8, 8);
+        canvasor::Canvasor c(picture);
+        c.FillRect(RectF(0, 0, 8, 8), state & (1UL << 2) ? ColorRGBAOf(0, 1, 0) : ColorRGBAOf(0, 0, 1));
+        return picture;
+    });
+    int clicks = 0;
+    button->SetClickFunction([&] { ++clicks; });
+    PointT middle = button->UI_LocalToGlobal(PointT(10, 10));
+    Desktop::Get().MouseDown(middle);
+    canvasor::Image pressed = Desktop::Get().Snapshot();
+    Desktop::Get().MouseUp(middle);
+    canvasor::Image released = Desktop::Get().Snapshot();
+    EXPECT_EQ(clicks, 1);
+    EXPECT_EQ(pressed.Pixel(middle.x, middle.y), ColorRGBAOf(0, 1, 0));
+    EXPECT_EQ(released.Pixel(middle.x, middle.y), ColorRGBAOf(0, 0, 1));
+    button->SetEnabled(false);
+    EXPECT_EQ(button->GetState(), 1UL << 4);
+    ASSERT_FALSE(asked.empty());
+
+    auto image = Add(new UI_StaticImage, RectF(100, 10, 8, 8));
+    canvasor::Image red(8, 8);
+    {
+        canvasor::Canvasor c(red);
+        c.FillRect(RectF(0, 0, 8, 8), ColorRGBAOf(1, 0, 0));
+    }
+    image->SetImage(red);
+    PointT at = image->UI_LocalToGlobal(PointT(4, 4));
+    EXPECT_EQ(Desktop::Get().Snapshot().Pixel(at.x, at.y), ColorRGBAOf(1, 0, 0));
 }
