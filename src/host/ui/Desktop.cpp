@@ -64,9 +64,12 @@ NativeWindow Desktop::CreateNativeWindow(std::u16string const& title, std::uint3
         record.properties[OS_Window::PropertyName] = object;
     }
     bool child = (style & style::Child) != 0;
-    if (child && Find(ownerOrParent)) {
-        record.parent = ownerOrParent;
-        Find(ownerOrParent)->children.push_back(record.handle);
+    if (child) {
+        // A child window may start without a parent (a panel made before its frame takes it).
+        if (Find(ownerOrParent)) {
+            record.parent = ownerOrParent;
+            Find(ownerOrParent)->children.push_back(record.handle);
+        }
     } else {
         record.owner = Find(ownerOrParent) ? ownerOrParent : 0;
         zOrder_.push_back(record.handle);
@@ -141,13 +144,17 @@ NativeWindow Desktop::GetParent(NativeWindow w) const {
 
 void Desktop::SetParent(NativeWindow child, NativeWindow parent) {
     NativeWindowRecord* record = Find(child);
-    if (!record || !record->parent || !Find(parent) || record->parent == parent || child == parent) {
+    if (!record || !(record->style & style::Child) || record->parent == parent || child == parent ||
+        (parent && !Find(parent))) {
         return;
     }
-    auto& siblings = Find(record->parent)->children;
-    siblings.erase(std::remove(siblings.begin(), siblings.end(), child), siblings.end());
+    if (NativeWindowRecord* old = Find(record->parent)) {
+        old->children.erase(std::remove(old->children.begin(), old->children.end(), child), old->children.end());
+    }
     record->parent = parent;
-    Find(parent)->children.push_back(child);
+    if (parent) {
+        Find(parent)->children.push_back(child);
+    }
 }
 
 NativeWindow Desktop::GetOwner(NativeWindow w) const {
@@ -201,12 +208,15 @@ RectT Desktop::GetWindowRect(NativeWindow w) const {
     if (!record) {
         return RectT();
     }
-    if (!record->parent) {
+    if (!record->parent && !(record->style & style::Child)) {
         return record->rect;
     }
     // A child window follows its node, or, without one, sits at its rectangle in the parent's client.
     if (record->object) {
         return record->object->UI_GetGlobalRect();
+    }
+    if (!record->parent) {
+        return record->rect;
     }
     RectT parentClient = GetClientRect(record->parent);
     return record->rect.Offset(parentClient.left, parentClient.top);
@@ -218,7 +228,7 @@ RectT Desktop::GetClientRect(NativeWindow w) const {
         return RectT();
     }
     RectT r = GetWindowRect(w);
-    if (record->parent || (record->style & style::Caption) != style::Caption) {
+    if ((record->style & style::Child) || (record->style & style::Caption) != style::Caption) {
         return r;
     }
     int top = BorderWidth + TitleBarHeight + (record->hasMenu ? MenuBarHeight : 0);

@@ -91,6 +91,7 @@ void OS_Window::UI_ParentChanged() {
             return;
         }
     }
+    desktop.SetParent(window_, 0); // out of any window for now
 }
 
 RectT OS_Window::UI_GetGlobalStructureRect() const {
