@@ -12,6 +12,8 @@ namespace orvworkspace::workspace {
 
 using PointT = orvcore::geom::Point;
 using RectT = orvcore::geom::Rect;
+using PointF = orvcore::geom::PointF;
+using RectF = orvcore::geom::RectF;
 
 // Pairs of UTF-8 strings describing a frame's tabs; the first string of each pair is a tab type.
 using TabDataList = std::vector<std::pair<std::string, std::string>>;

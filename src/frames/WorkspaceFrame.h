@@ -1,0 +1,111 @@
+// The tabbed frame: a tab well along the top (or the side) and a stack of panels below it, the front
+// one shown. It remembers closed panels so they can be reopened in place: the tab type and saved
+// state of destroyed ones (removed-tab data) and the panels themselves when they only hide.
+// Child 0 is the tab well and child 1 the panel container; tab i and panel i are the same panel.
+#pragma once
+
+#include "frames/TabPanelContainer.h"
+#include "frames/WorkspaceFrameBase.h"
+#include "host/ui/controls/TabWell.h"
+#include "workspace/TabPanel.h"
+
+#include <list>
+#include <string>
+#include <vector>
+
+namespace orvworkspace::workspace {
+
+class WorkspaceFrame : public WorkspaceFrameBase {
+public:
+    WorkspaceFrame(TopLevelWindow* window, RectT const& rect);
+    ~WorkspaceFrame() override;
+
+    // --- Layout host ---
+    void SetSizeAndPos(FrameZones const& zones) override;
+    PointT GetMinimumSize() const override;
+    void GetSnapSizes(std::vector<PointT>& sizes) const override;
+    RectT FrameRectToTabPanelRect(RectT const& r) const override;
+    RectT FrameRectToTabWellRect(RectT const& r) const override;
+    void DoGetTabData(TabDataList& visible, TabDataList& removed, TabDataList& hidden) const override;
+
+    // --- Tabs ---
+    long GetTabCount() const override;
+    long GetFrontTabIndex() const override;
+    TabPanel* GetTabPanel(long index) const override;
+    TabPanel* GetFrontTabPanel() const override;
+    boost::intrusive_ptr<TabPanel> DetachTabPanel(long index) override;
+    bool TabsAreReorderable() const override { return true; }
+    int GetTabPosition() const override;
+    void ConvertTabToFrameSize(PointT& size) const override;
+    void ConvertFrameToTabSize(PointT& size) const override;
+    void ConvertTabToFrameSizeIgnoreScrollbar(PointT& size) const;
+    void ConvertFrameToTabSizeIgnoreScrollbar(PointT& size) const;
+    RectT GetTabPanelRect() const override;
+    RectT GetTabWellRect() const;
+
+    void AddTab(boost::intrusive_ptr<TabPanel> panel, long index, bool select);
+    void AddTab(boost::intrusive_ptr<TabPanel> panel, bool select) {
+        AddTab(std::move(panel), GetTabCount(), select);
+    }
+    // A new panel of a type from its creator; null when there is none.
+    TabPanel* AddTab(std::string const& tabType, bool select);
+    // Moves the other frame's tabs here (in order), then its removed and hidden tabs.
+    void AddTabs(WorkspaceFrame* other);
+    void AddTabs(std::vector<boost::intrusive_ptr<TabPanel>> const& panels);
+    void AddTabs(std::vector<std::string> const& tabTypes);
+    void BringTabToFront(long index);
+    void BringTabToFront(TabPanel* panel);
+    void MoveTabPanel(long from, long to);
+    // A tab's item rectangle in frame coordinates, rounded down.
+    bool GetTabRect(long index, RectT& out) const;
+    bool GetTabIndexFromPos(PointT const& global, long& index) const;
+    orvui::controls::UI_TabWell* GetTabWell() const;
+    TabPanelContainer* GetContainer() const;
+
+    void TabPanelNameChanged(TabPanel const& panel) override;
+    void TabColorChanged(TabPanel const& panel) override;
+    void TabPanelCanCloseChanged(TabPanel const& panel);
+    void TabPanelLockableChanged(TabPanel const& panel);
+    void TabPanelLockedChanged(TabPanel const& panel);
+    void TabPanelMultitabChanged(TabPanel const& panel);
+
+    // --- Closing ---
+    bool AllowFrameClose() const;
+    void RemoveAllTabs(bool obliteratingOnly);
+    // Keeps what reopening a closed panel here needs: the panel itself, or its type and state.
+    void CacheTabData(boost::intrusive_ptr<TabPanel> const& panel, bool keepPanel);
+    bool HasHiddenTabs() const { return !hiddenTabs_.empty(); }
+    std::list<boost::intrusive_ptr<TabPanel>> const& HiddenTabs() const { return hiddenTabs_; }
+    void DetachHiddenTabs();
+    void DestroyHiddenTabs() { hiddenTabs_.clear(); }
+    bool HasRemovedTabData() const { return !removedTabData_.empty(); }
+    TabDataList const& GetRemovedTabData() const { return removedTabData_; }
+    void AddRemovedTabData(std::string const& tabType, std::string const& state);
+    void SetRemovedTabData(TabDataList const& data) { removedTabData_ = data; }
+    bool CanReanimateTab(std::string const& tabType) const;
+    bool CanReanimateTab(TabPanel const* panel) const;
+    TabPanel* ReanimateTab(std::string const& tabType);
+    bool ReanimateTab(boost::intrusive_ptr<TabPanel> const& panel);
+
+    // The tab well's gestures.
+    void HandleTabItemAction(int action, long index, RectT const* rect);
+    void SetTabMargin(float margin);
+    void RestoreDefaultMargin();
+
+    void UI_FocusChanged(int reason) override;
+    bool AllowFocusToAdvanceFromChildren() const override { return false; }
+    bool UI_DoMouseEvent(orvui::ui::UI_Node* target, orvui::ui::MouseEvent& event) override;
+
+private:
+    void UpdateForTabContainerChanges();
+    void FocusFrontPanel();
+    long IndexOf(TabPanel const* panel) const;
+
+    RectT cachedTabPanelRect_{-1, -1, -1, -1};
+    TabDataList removedTabData_;
+    std::list<boost::intrusive_ptr<TabPanel>> hiddenTabs_;
+};
+
+using WorkspaceFrameP = boost::intrusive_ptr<WorkspaceFrame>;
+
+} // namespace orvworkspace::workspace

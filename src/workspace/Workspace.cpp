@@ -1,0 +1,430 @@
+// The workspace: creators, counters, windows, closing tabs, focus and images.
+#include "workspace/Workspace.h"
+
+#include "frames/WorkspaceFrame.h"
+#include "host/core/Error.h"
+#include "host/core/ErrorTable.h"
+#include "host/ui/MonitorInfo.h"
+#include "host/ui/NodeManager.h"
+#include "host/ui/ResourceManager.h"
+#include "host/ui/canvasor/SupplierInterface.h"
+#include "workspace/TabCreator.h"
+#include "workspace/TabPanel.h"
+#include "workspace/TopLevelWindow.h"
+
+#include <algorithm>
+
+namespace orvworkspace::workspace {
+
+using namespace orvui::ui;
+
+Workspace::Workspace(canvasor::SupplierInterface* supplier)
+    : drawSupplier_(supplier ? supplier : UI_NodeManager::Get()->GetOSDrawSupplier())
+    , monitorInfo_(std::make_unique<orvui::utility::MonitorInfo>())
+    , resourceManager_(std::make_unique<orvui::utility::ResourceManager>()) {
+    InstallThemeChangedFunction([this] { InvalidateTopLevelWindows(); });
+    UI_NodeManager::Get()->InstallUserResizeFunction(
+        [this](bool begin, UI_Node* node, bool flag) { HandleUserResize(begin, node, flag); });
+}
+
+Workspace::~Workspace() {
+    InstallThemeChangedFunction(nullptr);
+    UI_NodeManager::Get()->InstallUserResizeFunction(nullptr);
+    tracker_.reset();
+    tabCreators_.clear();
+    Theme::Terminate();
+    DeleteChildren();
+}
+
+// --- Windows ---
+
+std::vector<TopLevelWindow*> Workspace::GetWindows() const {
+    std::vector<TopLevelWindow*> windows;
+    for (std::size_t i = 0; i < ChildSize(); ++i) {
+        if (auto* w = dynamic_cast<TopLevelWindow*>(ChildGet(i))) {
+            windows.push_back(w);
+        }
+    }
+    return windows;
+}
+
+TopLevelWindow* Workspace::GetMainTopLevelWindow() const {
+    for (TopLevelWindow* w : GetWindows()) {
+        if (w->IsMain()) {
+            return w;
+        }
+    }
+    return nullptr;
+}
+
+void Workspace::CreateMainTopLevelWindow(OSEventFunction osEventFunc) {
+    ChildPushBack(new TopLevelWindow(this, osEventFunc, true));
+}
+
+boost::intrusive_ptr<TopLevelWindow> Workspace::CreateTopLevelWindow(bool interim, RectT const* rect) {
+    return new TopLevelWindow(this, interim, rect);
+}
+
+boost::intrusive_ptr<TopLevelWindow> Workspace::AddTopLevelWindow(bool interim, RectT const* rect) {
+    boost::intrusive_ptr<TopLevelWindow> window = CreateTopLevelWindow(interim, rect);
+    ChildPushBack(window);
+    return window;
+}
+
+void Workspace::MakeWindowPermanent(boost::intrusive_ptr<TopLevelWindow> window) {
+    if (window) {
+        window->MakePermanent();
+        OnTopLevelWindowActivated(window.get());
+    }
+}
+
+bool Workspace::RemoveWindow(TopLevelWindow* window, bool record) {
+    recordRemovedWindows_ = record;
+    bool removed = ChildRequestRemove(window);
+    recordRemovedWindows_ = true;
+    return removed;
+}
+
+bool Workspace::ChildRequestRemove(boost::intrusive_ptr<UI_Node> node) {
+    auto* window = dynamic_cast<TopLevelWindow*>(node.get());
+    if (!window || window->IsMain()) {
+        return true;
+    }
+    window->RemoveTabPanels(true);
+    for (std::size_t i = 0; i < window->ChildSize(); ++i) {
+        auto* frame = dynamic_cast<WorkspaceFrame*>(window->ChildGet(i));
+        if (frame && !frame->AllowFrameClose()) {
+            return false;
+        }
+    }
+    if (window->UI_GetParentNode()) {
+        return UI_Container::ChildRequestRemove(node);
+    }
+    return true;
+}
+
+void Workspace::ReleaseTracker(bool cancel) {
+    std::unique_ptr<OS_Tracker> ending = std::move(tracker_);
+    if (ending) {
+        ending->End(cancel);
+    }
+}
+
+// --- Panels ---
+
+void Workspace::NewTabInFocused(std::string const& tabType) {
+    if (TabPanel* focused = GetFocusedTabPanel()) {
+        if (auto* frame = dynamic_cast<WorkspaceFrame*>(focused->GetFrame())) {
+            frame->AddTab(tabType, true);
+            return;
+        }
+    }
+    TopLevelWindow* main = GetMainTopLevelWindow();
+    if (main && main->AcceptsTabs()) {
+        if (WorkspaceFrame* root = main->GetRootFrame()) {
+            root->AddTab(tabType, true);
+        } else {
+            main->CreateRootFrame(tabType, true, true);
+        }
+        return;
+    }
+    AddTopLevelWindow(main == nullptr, nullptr)->CreateRootFrame(tabType, true, true);
+}
+
+WorkspaceFrame* Workspace::NewFrameInFocused(std::string const& tabType, LayoutManager::InsertionType side) {
+    if (TabPanel* focused = GetFocusedTabPanel()) {
+        if (auto* frame = dynamic_cast<WorkspaceFrame*>(focused->GetFrame())) {
+            return frame->GetTopLevelWindow()->AddTabbedFrame(frame, tabType, side);
+        }
+    }
+    TopLevelWindow* main = GetMainTopLevelWindow();
+    if (main && main->AcceptsTabs()) {
+        if (WorkspaceFrame* root = main->GetRootFrame()) {
+            return main->AddTabbedFrame(root, tabType, side);
+        }
+        return main->CreateRootFrame(tabType, true, true);
+    }
+    return AddTopLevelWindow(main == nullptr, nullptr)->CreateRootFrame(tabType, true, true);
+}
+
+bool Workspace::RemoveTab(WorkspaceFrame* frame, long index, bool cacheData, bool honourObliterate) {
+    if (!frame) {
+        return false;
+    }
+    boost::intrusive_ptr<UI_Node> keepFrame(frame->IsReferenced() ? frame : nullptr);
+    boost::intrusive_ptr<TopLevelWindow> window(frame->GetTopLevelWindow());
+    bool hadFocus = frame->UI_HasKeyboardFocus(false) || frame->UI_HasKeyboardFocus(true);
+    if (honourObliterate) {
+        if (TabPanel* panel = frame->GetTabPanel(index); panel && panel->ObliterateWhenClosed()) {
+            NotifyObliterating(panel);
+            cacheData = cacheData && panel->SaveStateWhenObliterated();
+        }
+    }
+    boost::intrusive_ptr<TabPanel> panel = frame->DetachTabPanel(index);
+    if (!panel) {
+        return false;
+    }
+    if (cacheData) {
+        frame->CacheTabData(panel, panel->HideWhenClosed());
+    }
+    // A frame that still has tabs has already focused its new front panel when it held the focus;
+    // moving the focus to the window's root frame from there would take it away from where the user
+    // was working. Refocusing is for frames that empty out.
+    bool refocus = false;
+    TopLevelWindow* focusWindow = window.get();
+    if (frame->GetTabCount() == 0) {
+        refocus = hadFocus;
+        bool keepPlace = frame->HasRemovedTabData() || frame->HasHiddenTabs();
+        window->RemoveFrame(frame, keepPlace);
+        if (!window->GetRootFrame()) {
+            if (!window->IsMain()) {
+                RemoveWindow(window.get(), keepPlace);
+            }
+            focusWindow = GetMainTopLevelWindow();
+            refocus = true;
+        }
+    }
+    if (refocus && focusWindow) {
+        if (WorkspaceFrame* root = focusWindow->GetRootFrame()) {
+            SetFocusedTabPanel(root->GetFrontTabPanel());
+        }
+    }
+    return true;
+}
+
+bool Workspace::RemoveTab(WorkspaceFrame* frame, TabPanel* panel, bool cacheData, bool honourObliterate) {
+    if (!frame) {
+        return false;
+    }
+    for (long i = 0; i < frame->GetTabCount(); ++i) {
+        if (frame->GetTabPanel(i) == panel) {
+            return RemoveTab(frame, i, cacheData, honourObliterate);
+        }
+    }
+    return false;
+}
+
+void Workspace::RegisterTabCreator(TabCreator* creator) {
+    if (!creator) {
+        return;
+    }
+    // The first registration wins; a second creator for the type is neither kept nor destroyed.
+    if (tabCreators_.count(creator->GetTabType())) {
+        return;
+    }
+    tabCreators_[creator->GetTabType()].reset(creator);
+}
+
+void Workspace::UnregisterTabCreator(std::string const& tabType) {
+    auto it = tabCreators_.find(tabType);
+    if (it != tabCreators_.end()) {
+        (void)it->second.release(); // unregistering hands the creator back to whoever made it
+        tabCreators_.erase(it);
+    }
+}
+
+TabCreator* Workspace::FindCreator(std::string const& tabType) const {
+    auto it = tabCreators_.find(tabType);
+    return it == tabCreators_.end() ? nullptr : it->second.get();
+}
+
+bool Workspace::TabTypeHidesWhenClosed(std::string const& tabType) const {
+    TabCreator* creator = FindCreator(tabType);
+    return creator && creator->HidesWhenClosed();
+}
+
+bool Workspace::TabTypeObliteratesWhenClosed(std::string const& tabType) const {
+    TabCreator* creator = FindCreator(tabType);
+    return creator && creator->ObliteratesWhenClosed();
+}
+
+bool Workspace::TabTypeSavesStateWhenObliterated(std::string const& tabType) const {
+    TabCreator* creator = FindCreator(tabType);
+    return creator && creator->SavesStateWhenObliterated();
+}
+
+struct Workspace::LayoutDisabled {
+    explicit LayoutDisabled(Workspace& w)
+        : workspace(w) {
+        workspace.SetLayoutEnabled(false);
+    }
+    ~LayoutDisabled() { workspace.SetLayoutEnabled(true); }
+    Workspace& workspace;
+};
+
+void Workspace::SetLayoutEnabled(bool enabled) {
+    layoutDisableCount_ += enabled ? -1 : 1;
+}
+
+// --- Focus ---
+
+TabPanel* Workspace::GetFocusedTabPanel() const {
+    for (UI_Node* n = UI_Node::UI_GetKeyboardFocusLeafNode(); n; n = n->UI_GetParentNode()) {
+        if (auto* panel = dynamic_cast<TabPanel*>(n)) {
+            return panel;
+        }
+    }
+    return nullptr;
+}
+
+void Workspace::SetFocusedTabPanel(TabPanel* panel) {
+    if (settingFocus_ || !panel) {
+        return;
+    }
+    settingFocus_ = true;
+    UI_Node* leaf = UI_Node::UI_GetKeyboardFocusLeafNode();
+    bool needFocus = !(leaf && panel->IsAncestorOf(leaf));
+    if (auto* frame = dynamic_cast<WorkspaceFrame*>(panel->GetFrame())) {
+        frame->BringTabToFront(panel);
+    }
+    if (needFocus && GetFocusedTabPanel() != panel) {
+        if (auto* frame = panel->GetFrame()) {
+            if (TopLevelWindow* window = frame->GetTopLevelWindow()) {
+                window->Activate(false);
+            }
+        }
+        panel->UI_GainKeyboardFocus(FocusByProgram);
+    }
+    settingFocus_ = false;
+}
+
+TabPanel* Workspace::GetLastTouchedTabPanel() const {
+    TabPanel* best = nullptr;
+    for (TopLevelWindow* window : GetWindows()) {
+        TabPanel* candidate = window->GetLastTouchedTabPanel();
+        if (candidate && (!best || candidate->GetTouchStamp() > best->GetTouchStamp())) {
+            best = candidate;
+        }
+    }
+    return best;
+}
+
+TabPanel* Workspace::GetTabPanelFromPos(PointT const& global) const {
+    auto* window = dynamic_cast<TopLevelWindow*>(GetTopLevelWindowFromPos(global));
+    WorkspaceFrame* frame = window ? window->GetFrameFromPos(global) : nullptr;
+    if (!frame) {
+        return nullptr;
+    }
+    for (long i = 0; i < frame->GetTabCount(); ++i) {
+        TabPanel* panel = frame->GetTabPanel(i);
+        if (panel->UI_IsShown() && panel->UI_GetGlobalRect().Contains(global)) {
+            return panel;
+        }
+    }
+    return nullptr;
+}
+
+// --- Windows en masse ---
+
+void Workspace::InvalidateTopLevelWindows() {
+    for (TopLevelWindow* w : GetWindows()) {
+        w->UI_Invalidate(nullptr, 0);
+    }
+}
+
+void Workspace::UpdateNowTopLevelWindows(orvcore::utility::Flags<unsigned long> flags) {
+    for (TopLevelWindow* w : GetWindows()) {
+        w->UI_UpdateNow(unsigned(flags.Get()));
+    }
+}
+
+void Workspace::ReLayoutTopLevelWindows() {
+    for (TopLevelWindow* w : GetWindows()) {
+        w->GetLayoutManager()->ReLayout(false, true, false);
+    }
+}
+
+void Workspace::RemoveTabPanels() {
+    {
+        LayoutDisabled disabled(*this);
+        std::vector<boost::intrusive_ptr<TopLevelWindow>> windows;
+        for (TopLevelWindow* w : GetWindows()) {
+            windows.emplace_back(w);
+        }
+        for (auto const& w : windows) {
+            w->RemoveTabPanels(false);
+            if (!w->IsMain()) {
+                w->UI_Show(false);
+            }
+        }
+        ClearRemovedWindowData();
+    }
+    if (GetLayoutEnabled()) {
+        ReLayoutTopLevelWindows();
+    }
+}
+
+void Workspace::DestroyTabPanels() {
+    {
+        LayoutDisabled disabled(*this);
+        std::vector<boost::intrusive_ptr<TopLevelWindow>> windows;
+        for (TopLevelWindow* w : GetWindows()) {
+            windows.emplace_back(w);
+        }
+        for (auto const& w : windows) {
+            w->DestroyTabPanels();
+        }
+        ClearRemovedWindowData();
+    }
+    if (GetLayoutEnabled()) {
+        ReLayoutTopLevelWindows();
+    }
+}
+
+void Workspace::BringAppToFront() {
+    TopLevelWindow* main = GetMainTopLevelWindow();
+    if (!main) {
+        return;
+    }
+    if (main->UI_IsMinimized()) {
+        main->UI_Minimize(false);
+    }
+    main->UI_Activate();
+    main->UI_UpdateNow(~0u);
+}
+
+// --- Drawing and resources ---
+
+canvasor::SupplierInterface* Workspace::GetOSDrawSupplier() const {
+    return UI_NodeManager::Get()->GetOSDrawSupplier();
+}
+
+void Workspace::ResetDisplaySettings() {
+    monitorInfo_->Refresh();
+}
+
+orvui::utility::ResourceManager* Workspace::GetResourceManager() const {
+    if (!resourceManager_) {
+        orvcore::config::ThrowError(orvcore::config::errors::UnableToAccessResource);
+    }
+    return resourceManager_.get();
+}
+
+canvasor::FileImageP Workspace::GetImage(WorkspaceImage image) const {
+    int index = int(image);
+    if (index < 0 || index > 2) {
+        return nullptr;
+    }
+    if (!imagesLoaded_[index]) {
+        static char const* const names[] = {"closebox", "gripper", "DownArrow"};
+        if (resourceManager_ && drawSupplier_) {
+            images_[index] = drawSupplier_->MakeFileImage(resourceManager_->GetResource("png", names[index]));
+        }
+        imagesLoaded_[index] = true;
+    }
+    return images_[index];
+}
+
+void Workspace::HandleUserResize(bool begin, UI_Node* node, bool flag) {
+    auto* window = dynamic_cast<TopLevelWindow*>(node);
+    if (!window) {
+        return;
+    }
+    if (begin) {
+        NotifyTopLevelUserResizeBegin(window, flag);
+    } else {
+        NotifyTopLevelUserResizeEnd(window, flag);
+    }
+}
+
+} // namespace orvworkspace::workspace

@@ -1,0 +1,156 @@
+// The one object a host creates for its whole interface: the root container of every top-level
+// window, the registry of tab creators, the source of panel identifiers and touch stamps, the owner
+// of the single active mouse tracker, and where the library reports its events through empty hooks.
+// Hosts derive from it. Windows are its children, in child order; it keeps no other list of them.
+#pragma once
+
+#include "host/core/Flags.h"
+#include "host/ui/canvasor/Image.h"
+#include "layout/LayoutManager.h"
+#include "platform/OS_Tracker.h"
+#include "platform/OS_Workspace.h"
+
+#include <map>
+#include <memory>
+#include <string>
+#include <vector>
+
+namespace canvasor {
+class SupplierInterface;
+}
+namespace orvui::utility {
+class MonitorInfo;
+class ResourceManager;
+} // namespace orvui::utility
+
+namespace orvworkspace::workspace {
+
+class TabCreator;
+class TabPanel;
+class TopLevelWindow;
+class WorkspaceFrame;
+
+class Workspace : public OS_Workspace {
+public:
+    enum WorkspaceImage { CloseBox = 0, Gripper = 1, DownArrow = 2 };
+
+    explicit Workspace(canvasor::SupplierInterface* supplier = nullptr);
+    ~Workspace() override;
+
+    // --- Windows ---
+    // Refuses (true, nothing removed) for the main window; removes the window's panels first, and
+    // keeps the window when one of its frames refuses to close.
+    bool ChildRequestRemove(boost::intrusive_ptr<orvui::ui::UI_Node> node) override;
+    void CreateMainTopLevelWindow(OSEventFunction osEventFunc) override;
+    virtual void MakeWindowPermanent(boost::intrusive_ptr<TopLevelWindow> window);
+    virtual boost::intrusive_ptr<TopLevelWindow> AddTopLevelWindow(bool interim, RectT const* rect);
+    virtual boost::intrusive_ptr<TopLevelWindow> CreateTopLevelWindow(bool interim, RectT const* rect);
+    virtual bool RemoveWindow(TopLevelWindow* window, bool record);
+    TopLevelWindow* GetMainTopLevelWindow() const;
+    std::vector<TopLevelWindow*> GetWindows() const;
+
+    // --- Tracker ---
+    OS_Tracker* GetTracker() const override { return tracker_.get(); }
+    void SetTracker(std::unique_ptr<OS_Tracker> tracker) { tracker_ = std::move(tracker); }
+    void ReleaseTracker(bool cancel) override;
+
+    // --- Host commands and hooks ---
+    virtual void DoWorkspaceCmdNew() {}
+    virtual void DoWorkspaceCmdDelete() {}
+    virtual void DoWorkspaceCmdReset() {}
+    virtual void NotifyObliterating(TabPanel*) {}
+    virtual void NotifyPreOrphaning(TabPanel*) {}
+    virtual void NotifyOrphaning(TabPanel*) {}
+    virtual void NotifyRestoreWorkspaceBegin() {}
+    virtual void NotifyRestoreWorkspaceEnd() {}
+    virtual void NotifyTabDragBegin(TabPanel*) {}
+    virtual void NotifyTabDragEnd(TabPanel*) {}
+    virtual void NotifySplitterDragBegin(TopLevelWindow*) {}
+    virtual void NotifySplitterDragEnd(TopLevelWindow*) {}
+    virtual void NotifyTopLevelUserResizeBegin(TopLevelWindow*, bool) {}
+    virtual void NotifyTopLevelUserResizeEnd(TopLevelWindow*, bool) {}
+    virtual void OnTopLevelWindowActivated(TopLevelWindow*) {}
+    virtual void OnTabPanelGainedFocus(TabPanel*) {}
+
+    // --- Panels ---
+    // A new panel of the type in the focused frame (or the main window, or a new window).
+    virtual void NewTabInFocused(std::string const& tabType);
+    virtual WorkspaceFrame* NewFrameInFocused(std::string const& tabType, LayoutManager::InsertionType side);
+    virtual unsigned short GetTabMinWidth() const { return 35; }
+    // Closes a tab: returns whether a panel was detached. Caching keeps what reopening it needs; an
+    // emptied frame leaves the layout (keeping its place while it holds closed panels), and an
+    // emptied floating window is removed.
+    virtual bool RemoveTab(WorkspaceFrame* frame, long index, bool cacheData, bool honourObliterate);
+    virtual bool RemoveTab(WorkspaceFrame* frame, TabPanel* panel, bool cacheData, bool honourObliterate);
+
+    void RegisterTabCreator(TabCreator* creator);
+    void UnregisterTabCreator(std::string const& tabType);
+    TabCreator* FindCreator(std::string const& tabType) const;
+    bool TabTypeHidesWhenClosed(std::string const& tabType) const;
+    bool TabTypeObliteratesWhenClosed(std::string const& tabType) const;
+    bool TabTypeSavesStateWhenObliterated(std::string const& tabType) const;
+
+    unsigned long NewUniqueID() { return nextUniqueID_++; }
+    unsigned long FreshTabTimeStamp() { return ++freshTabTimeStamp_; }
+    void SetFreshTabTimeStamp(unsigned long value) { freshTabTimeStamp_ = value; }
+    void SetCreateTabPanelAssertionMode(bool on) { createTabPanelAssertionCount_ += on ? 1 : -1; }
+    bool GetCreateTabPanelAssertionMode() const { return createTabPanelAssertionCount_ != 0; }
+    void SetLayoutEnabled(bool enabled);
+    bool GetLayoutEnabled() const { return layoutDisableCount_ == 0; }
+    void SetSplitterSnappingEnabled(bool enabled) { splitterSnappingEnabled_ = enabled; }
+    bool GetSplitterSnappingEnabled() const { return splitterSnappingEnabled_; }
+    static void SetDragTabSoundFeedbackEnabled(bool enabled) { dragTabSoundFeedbackEnabled = enabled; }
+    static bool GetDragTabSoundFeedbackEnabled() { return dragTabSoundFeedbackEnabled; }
+
+    // --- Focus ---
+    // The panel at or above the keyboard-focus leaf; focus is never stored here.
+    TabPanel* GetFocusedTabPanel() const;
+    void SetFocusedTabPanel(TabPanel* panel);
+    void TabPanelGainedFocus(TabPanel* panel) { OnTabPanelGainedFocus(panel); }
+    TabPanel* GetLastTouchedTabPanel() const;
+    TabPanel* GetTabPanelFromPos(PointT const& global) const;
+
+    // --- Windows en masse ---
+    void InvalidateTopLevelWindows();
+    void UpdateNowTopLevelWindows(orvcore::utility::Flags<unsigned long> flags);
+    void ReLayoutTopLevelWindows();
+    void RemoveTabPanels();
+    void DestroyTabPanels();
+    void ClearRemovedWindowData() {}
+    void BringAppToFront();
+
+    // --- Drawing and resources ---
+    canvasor::SupplierInterface* GetDrawSupplier() const { return drawSupplier_; }
+    void SetDrawSupplier(canvasor::SupplierInterface* supplier) { drawSupplier_ = supplier; }
+    canvasor::SupplierInterface* GetOSDrawSupplier() const;
+    orvui::utility::MonitorInfo* ORV_GetMonitorInfo() const { return monitorInfo_.get(); }
+    void ResetDisplaySettings();
+    canvasor::FileImageP GetImage(WorkspaceImage image) const;
+    // The library's resources; raises UnableToAccessResource when there are none.
+    orvui::utility::ResourceManager* GetResourceManager() const;
+    void DrawDockProgress(int, int) {}
+
+protected:
+    void HandleUserResize(bool begin, orvui::ui::UI_Node* node, bool flag);
+
+private:
+    struct LayoutDisabled;
+
+    std::unique_ptr<OS_Tracker> tracker_;
+    unsigned long freshTabTimeStamp_ = 0;
+    unsigned long nextUniqueID_ = 0;
+    long createTabPanelAssertionCount_ = 0;
+    std::map<std::string, std::unique_ptr<TabCreator>> tabCreators_;
+    bool splitterSnappingEnabled_ = true;
+    bool settingFocus_ = false;
+    long layoutDisableCount_ = 0;
+    canvasor::SupplierInterface* drawSupplier_;
+    std::unique_ptr<orvui::utility::MonitorInfo> monitorInfo_;
+    mutable canvasor::FileImageP images_[3];
+    mutable bool imagesLoaded_[3] = {false, false, false};
+    bool recordRemovedWindows_ = true;
+    std::unique_ptr<orvui::utility::ResourceManager> resourceManager_;
+    static inline bool dragTabSoundFeedbackEnabled = false;
+};
+
+} // namespace orvworkspace::workspace
