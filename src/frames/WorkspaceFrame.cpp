@@ -4,12 +4,16 @@
 
 #include "host/core/Error.h"
 #include "host/core/ErrorTable.h"
+#include "host/core/Localizer.h"
 #include "host/core/PropList.h"
 #include "host/core/PropListUtils.h"
+#include "host/ui/Menu.h"
+#include "host/ui/NodeManager.h"
 #include "workspace/TabCreator.h"
 #include "workspace/TabPanel.h"
 #include "workspace/TopLevelWindow.h"
 #include "workspace/Workspace.h"
+#include "workspace/WorkspaceUtils.h"
 
 #include <algorithm>
 #include <cmath>
@@ -512,10 +516,19 @@ void WorkspaceFrame::HandleTabItemAction(int action, long index, RectT const* re
     case orvui::controls::TabPressed:
     case orvui::controls::TabKeyboardActivated:
     case orvui::controls::TabDoubleClicked:
+        BringTabToFront(index);
+        FocusFrontPanel();
+        break;
     case orvui::controls::FlyoutMenuClicked:
+        if (panel && GetWorkspace()) {
+            GetWorkspace()->SetFocusedTabPanel(panel);
+        }
+        DoTabMenu(index, false, rect);
+        break;
     case orvui::controls::TabSecondaryPressed:
         BringTabToFront(index);
         FocusFrontPanel();
+        DoTabMenu(index, true, rect);
         break;
     case orvui::controls::TabCloseClicked:
         if (panel) {
@@ -552,6 +565,184 @@ void WorkspaceFrame::HandleTabItemAction(int action, long index, RectT const* re
     default:
         break;
     }
+}
+
+// --- Flyout menu ---
+
+bool WorkspaceFrame::AllowCloseOtherSimilar(long index) const {
+    TabPanel* panel = GetTabPanel(index);
+    if (!panel || !GetWorkspace()) {
+        return false;
+    }
+    std::list<TabPanel*> similar;
+    WorkspaceUtils::FindAllTabsOfType(*GetWorkspace(), panel->GetTabType(), similar);
+    bool another = false;
+    for (TabPanel* other : similar) {
+        if (other == panel) {
+            continue;
+        }
+        if (!other->AllowClose()) {
+            return false;
+        }
+        another = true;
+    }
+    return another;
+}
+
+void WorkspaceFrame::RemoveOtherSimilarTabs(long index, bool obliteratingOnly) {
+    TabPanel* panel = GetTabPanel(index);
+    if (!panel || !GetWorkspace()) {
+        return;
+    }
+    boost::intrusive_ptr<UI_Node> keep(IsReferenced() ? this : nullptr);
+    std::list<TabPanel*> similar;
+    WorkspaceUtils::FindAllTabsOfType(*GetWorkspace(), panel->GetTabType(), similar);
+    // Removing one may empty its frame and window; hold every panel until the end.
+    std::vector<boost::intrusive_ptr<TabPanel>> held;
+    for (TabPanel* other : similar) {
+        if (other != panel && other->IsReferenced()) {
+            held.emplace_back(other);
+        }
+    }
+    for (auto const& other : held) {
+        auto* frame = dynamic_cast<WorkspaceFrame*>(other->GetFrame());
+        if (frame && (!obliteratingOnly || other->ObliterateWhenClosed())) {
+            GetWorkspace()->RemoveTab(frame, other.get(), true, true);
+        }
+    }
+}
+
+void WorkspaceFrame::PopulateTabMenu(long index, orvui::utility::OS_Menu& menu) const {
+    TabPanel* panel = GetTabPanel(index);
+    TopLevelWindow* window = GetTopLevelWindow();
+    if (!panel || !window) {
+        return;
+    }
+    auto const& text = [](char const* s) { return orvcore::config::Localizer::Get().Localize(s); };
+    bool inMain = window->IsMain();
+    bool severalFrames = window->GetFrameCount() > 1;
+    menu.AppendItem(
+        text("$$$/orvworkspace/workspace/WorkspaceFrame/FrameFlyoutMenuItem/UndockPanel=Undock Panel"),
+        CommandNumber(UndockPanel), inMain || GetTabCount() > 1 || severalFrames);
+    menu.AppendItem(
+        text("$$$/orvworkspace/workspace/WorkspaceFrame/FrameFlyoutMenuItem/UndockFrame=Undock Frame"),
+        CommandNumber(UndockFrame), inMain || severalFrames);
+    menu.AppendItem(
+        text("$$$/orvworkspace/workspace/WorkspaceFrame/FrameFlyoutMenuItem/ClosePanel=Close Panel"),
+        CommandNumber(ClosePanel), panel->AllowClose());
+    if (panel->IsCloseOtherSimilarPanelsEnabled()) {
+        std::u16string label = panel->GetCustomCloseOtherSimilarPanelsDisplayString();
+        if (label.empty()) {
+            label = text("$$$/orvworkspace/workspace/WorkspaceFrame/FrameFlyoutMenuItem/"
+                         "CloseOtherSimilarPanels=Close Other Similar Panels");
+        }
+        menu.AppendItem(label, CommandNumber(CloseOtherSimilarPanels), AllowCloseOtherSimilar(index));
+    }
+    menu.AppendItem(
+        text("$$$/orvworkspace/workspace/WorkspaceFrame/FrameFlyoutMenuItem/CloseFrame=Close Frame"),
+        CommandNumber(CloseFrame), AllowFrameClose());
+    if (index == GetFrontTabIndex()) {
+        bool maximised = window->GetLayoutManager()->IsTheMaximizedFrame(GetLMFrame());
+        menu.AppendItem(maximised
+                            ? text("$$$/orvworkspace/workspace/Frame/RestoreFrameSize=Restore Frame Size")
+                            : text("$$$/orvworkspace/workspace/Frame/MaximizeFrame=Maximize Frame"),
+                        CommandNumber(MaximizeFrame), WorkspaceUtils::CanHaveMaximizedFrame(window));
+        panel->PopulateFlyoutMenu(menu);
+    }
+}
+
+void WorkspaceFrame::DoTabMenu(long index, bool asContextMenu, RectT const* rect) {
+    boost::intrusive_ptr<UI_Node> keep(IsReferenced() ? this : nullptr);
+    orvui::utility::OS_Menu menu;
+    PopulateTabMenu(index, menu);
+    if (menu.Items().empty()) {
+        return;
+    }
+    RectT anchor;
+    if (rect) {
+        anchor = *rect;
+    } else if (!GetTabRect(index, anchor)) {
+        anchor = RectT(0, 0, 0, 0);
+    } else {
+        anchor = UI_LocalToGlobal(anchor);
+    }
+    NativeWindow owner = GetTopLevelWindow() ? GetTopLevelWindow()->GetPlatformWindow() : 0;
+    unsigned long command =
+        asContextMenu ? orvui::utility::UI_DoContextMenu(menu, PointT(anchor.left, anchor.top), owner)
+                      : orvui::utility::UI_DoPopupMenu(menu, anchor, owner);
+    DoTabMenuCommand(index, command);
+}
+
+void WorkspaceFrame::DoTabMenuCommand(long index, unsigned long command) {
+    if (command == 0) {
+        return;
+    }
+    boost::intrusive_ptr<UI_Node> keep(IsReferenced() ? this : nullptr);
+    TabPanel* found = GetTabPanel(index);
+    boost::intrusive_ptr<TabPanel> panel(found && found->IsReferenced() ? found : nullptr);
+    switch (long(command)) {
+    case UndockPanel:
+        Undock(index, false);
+        break;
+    case UndockFrame:
+        Undock(index, true);
+        break;
+    case ClosePanel:
+        GetWorkspace()->RemoveTab(this, index, true, true);
+        return;
+    case CloseOtherSimilarPanels:
+        RemoveOtherSimilarTabs(index, false);
+        return;
+    case CloseFrame:
+        RemoveAllTabs(false);
+        return;
+    case MaximizeFrame:
+        WorkspaceUtils::ToggleThisFrameMaximizationState(*GetWorkspace(), this);
+        break;
+    default:
+        break;
+    }
+    if (panel) {
+        panel->DoFlyoutMenuCommand(command);
+    }
+}
+
+void WorkspaceFrame::Undock(long index, bool wholeFrame) {
+    TabPanel* found = GetTabPanel(index);
+    TopLevelWindow* source = GetTopLevelWindow();
+    Workspace* workspace = GetWorkspace();
+    if (!found || !source || !workspace) {
+        return;
+    }
+    boost::intrusive_ptr<WorkspaceFrame> self(this);
+    boost::intrusive_ptr<TabPanel> panel(found);
+    UI_NodeManager::GroupingFocusChanges grouping;
+    RectT rect = panel->UI_GetGlobalRect();
+    PointT snap;
+    GetLMFrame()->GetGreatestSnapSize(snap);
+    if (snap.x != 0 || snap.y != 0) {
+        ConvertFrameToTabSize(snap);
+        rect.width = snap.x != 0 ? snap.x : rect.width;
+        rect.height = snap.y != 0 ? snap.y : rect.height;
+    }
+    bool fromMain = source->IsMain();
+    boost::intrusive_ptr<TopLevelWindow> window = workspace->AddTopLevelWindow(false, nullptr);
+    if (wholeFrame) {
+        source->RemoveFrame(self, false);
+        SetTopLevelWindow(window.get());
+        window->ChildPushBack(self);
+        window->SetRootFrame(self, true);
+    } else {
+        workspace->RemoveTab(this, index, false, false);
+        window->CreateRootFrame(panel, true);
+    }
+    window->SetToGlobalTabSize(rect);
+    if (!fromMain) {
+        RectT outer = window->UI_GetGlobalStructureRect();
+        window->UI_Move(PointT(outer.left + 20, outer.top + 20));
+    }
+    window->UI_Show(true);
+    workspace->SetFocusedTabPanel(GetFrontTabPanel());
 }
 
 void WorkspaceFrame::SetTabMargin(float margin) {

@@ -13,6 +13,10 @@
 #include <string>
 #include <vector>
 
+namespace orvui::utility {
+class OS_Menu;
+}
+
 namespace orvworkspace::workspace {
 
 class WorkspaceFrame : public WorkspaceFrameBase {
@@ -86,6 +90,33 @@ public:
     bool CanReanimateTab(TabPanel const* panel) const;
     TabPanel* ReanimateTab(std::string const& tabType);
     bool ReanimateTab(boost::intrusive_ptr<TabPanel> const& panel);
+
+    // Whether every other panel of the workspace of this tab's type may close (and there is one).
+    bool AllowCloseOtherSimilar(long index) const;
+    void RemoveOtherSimilarTabs(long index, bool obliteratingOnly);
+
+    // --- Flyout menu ---
+    // The frame's commands; a panel's own commands are positive numbers.
+    enum FlyoutCommand : long {
+        UndockPanel = -1,
+        UndockFrame = -2,
+        ClosePanel = -3,
+        CloseOtherSimilarPanels = -4,
+        CloseFrame = -5,
+        MaximizeFrame = -6,
+    };
+    static unsigned long CommandNumber(FlyoutCommand command) {
+        return static_cast<unsigned long>(long(command));
+    }
+    // Fills the flyout menu of a tab: the frame's items, enabled as they apply, then (for the front
+    // tab) the panel's own.
+    void PopulateTabMenu(long index, orvui::utility::OS_Menu& menu) const;
+    // Shows the flyout menu of a tab (as a popup under the global rectangle, or as a context menu at
+    // its corner) and carries out the chosen command.
+    void DoTabMenu(long index, bool asContextMenu, RectT const* rect);
+    void DoTabMenuCommand(long index, unsigned long command);
+    // Moves a tab's panel, or the whole frame, into a new floating window over the panel's place.
+    void Undock(long index, bool wholeFrame);
 
     // The tab well's gestures.
     void HandleTabItemAction(int action, long index, RectT const* rect);

@@ -21,6 +21,15 @@ WorkspaceFrameBase::WorkspaceFrameBase(TopLevelWindow* window)
 
 WorkspaceFrameBase::~WorkspaceFrameBase() = default;
 
+void WorkspaceFrameBase::SetTopLevelWindow(TopLevelWindow* window) {
+    if (!window || window == window_) {
+        return;
+    }
+    window_ = window;
+    workspace_ = window->GetWorkspace();
+    frame_.SetLayoutManager(window->GetLayoutManager());
+}
+
 void WorkspaceFrameBase::SetZoneRects(FrameZones const& zones) {
     zones_ = zones;
     RectT whole = zones[FrameZones::Whole];

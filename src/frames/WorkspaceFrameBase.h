@@ -58,6 +58,8 @@ public:
     RectT GetTabContentRect() const { return zones_[FrameZones::Whole]; }
     Workspace* GetWorkspace() const { return workspace_; }
     TopLevelWindow* GetTopLevelWindow() const { return window_; }
+    // Moves the frame to another window: its layout element then belongs to that window's layout.
+    void SetTopLevelWindow(TopLevelWindow* window);
     Frame* GetLMFrame() { return &frame_; }
     Frame const* GetLMFrame() const { return &frame_; }
 

@@ -32,7 +32,7 @@ protected:
         std::filesystem::path file =
             dir / (std::string(info->test_suite_name()) + "." + info->name() + ".png");
         orvui::ui::Desktop::Get().Snapshot().WritePNG(file.string());
-        std::printf("snapshot of the failing screen: %s\n", file.string().c_str());
+        std::printf("screen snapshot: %s\n", file.string().c_str());
         return file;
     }
 };
