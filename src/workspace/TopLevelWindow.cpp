@@ -1,13 +1,16 @@
 // Top-level windows: their layout, frames, closed frames, edge drop zones, drawing and input.
 #include "workspace/TopLevelWindow.h"
 
+#include "frames/TablessWorkspaceFrame.h"
 #include "frames/WorkspaceFrame.h"
+#include "host/ui/MonitorInfo.h"
 #include "host/ui/NodeManager.h"
 #include "host/ui/ResourceManager.h"
 #include "host/ui/Theme.h"
 #include "host/ui/canvasor/Canvasor.h"
 #include "host/ui/controls/TabWell.h"
 #include "layout/FrameDataProxy.h"
+#include "workspace/TabCreator.h"
 #include "workspace/TabPanel.h"
 #include "workspace/Workspace.h"
 
@@ -97,6 +100,10 @@ boost::intrusive_ptr<WorkspaceFrame> TopLevelWindow::CreateWorkspaceFrame(RectT 
     boost::intrusive_ptr<WorkspaceFrame> frame(new WorkspaceFrame(this, rect));
     ChildPushBack(frame);
     return frame;
+}
+
+boost::intrusive_ptr<TablessWorkspaceFrame> TopLevelWindow::CreateTablessFrame(RectT const& rect) {
+    return new TablessWorkspaceFrame(this, rect);
 }
 
 boost::intrusive_ptr<WorkspaceFrame> TopLevelWindow::CreateWorkspaceFrame() {
@@ -399,9 +406,11 @@ void TopLevelWindow::DestroyTabPanels() {
 
 RectT TopLevelWindow::AreaWithoutStaticFrames() const {
     RectT area = ClientRectInScreen();
+    // A tabless frame answers an empty local rectangle to the layout; its extent is where the layout
+    // placed it.
     auto extent = [&](LayoutManager::InsertionType type) {
-        Frame* f = layoutManager_->GetStaticBorderFrame(type);
-        return f ? f->GetFrameLocalRect() : RectT();
+        TablessWorkspaceFrame* frame = GetBorderFrame(type);
+        return frame ? frame->GetTabContentRect() : RectT();
     };
     if (layoutManager_->HasStaticBorderFrame(LayoutManager::Top)) {
         int h = extent(LayoutManager::Top).height;
@@ -518,6 +527,175 @@ void TopLevelWindow::ResetRootFrame(Splitter* splitter,
     for (auto const& frame : frames) {
         frame->GetLMFrame()->SetLayoutManager(layoutManager_.get());
     }
+}
+
+// --- Static elements ---
+
+TablessWorkspaceFrame* TopLevelWindow::GetBorderFrame(LayoutManager::InsertionType side) const {
+    Frame* f = layoutManager_->GetStaticBorderFrame(side);
+    return f ? dynamic_cast<TablessWorkspaceFrame*>(static_cast<WorkspaceFrameBase*>(f->GetHostData()))
+             : nullptr;
+}
+
+bool TopLevelWindow::HasStaticElement(LayoutManager::InsertionType side) const {
+    return layoutManager_->HasStaticBorderFrame(side);
+}
+
+TabPanel* TopLevelWindow::GetStaticElement(LayoutManager::InsertionType side) const {
+    TablessWorkspaceFrame* frame = GetBorderFrame(side);
+    return frame ? frame->GetTab() : nullptr;
+}
+
+void TopLevelWindow::SetStaticElement(boost::intrusive_ptr<TabPanel> const& panel,
+                                      LayoutManager::InsertionType side, bool relayout) {
+    if (!panel) {
+        return;
+    }
+    if (HasStaticElement(side)) {
+        RemoveStaticElement(side, false); // one element per edge
+    }
+    RectT rect = ClientLocalRect();
+    boost::intrusive_ptr<TablessWorkspaceFrame> frame = CreateTablessFrame(rect);
+    frame->AddTab(panel);
+    frame->UI_Show(true);
+    ChildPushBack(frame);
+    layoutManager_->SetStaticBorderFrame(frame->GetLMFrame(), rect, side, relayout);
+}
+
+TabPanel* TopLevelWindow::SetStaticElement(std::string const& tabType, LayoutManager::InsertionType side,
+                                           bool relayout) {
+    TabCreator* creator = workspace_ ? workspace_->FindCreator(tabType) : nullptr;
+    boost::intrusive_ptr<TabPanel> panel = creator ? creator->CreateTabPanel(workspace_, nullptr) : nullptr;
+    if (!panel) {
+        return nullptr;
+    }
+    SetStaticElement(panel, side, relayout);
+    return panel.get();
+}
+
+void TopLevelWindow::RemoveStaticElement(LayoutManager::InsertionType side, bool relayout) {
+    boost::intrusive_ptr<TablessWorkspaceFrame> frame(GetBorderFrame(side));
+    if (frame) {
+        ChildRemove(frame.get());
+    }
+    layoutManager_->SetStaticBorderFrame(nullptr, ClientLocalRect(), side, relayout);
+    UI_Invalidate();
+}
+
+// --- Mega zoom ---
+
+RectT TopLevelWindow::GetMegaZoomMonitor(bool primary) const {
+    orvui::utility::MonitorInfo* monitors = workspace_ ? workspace_->ORV_GetMonitorInfo() : nullptr;
+    if (!monitors) {
+        return RectT();
+    }
+    monitors->Refresh();
+    RectT monitor;
+    if (primary && monitors->GetMonitorRect(0, monitor) && monitor.width >= 1 && monitor.height >= 1) {
+        return monitor;
+    }
+    monitors->GetMonitorRectFromRect(UI_GetGlobalStructureRect(), monitor);
+    return monitor;
+}
+
+PointT TopLevelWindow::GetSingleWorkspaceFramePreferredTabSize() const {
+    if (main_ || !HasSingleWorkspaceFrame()) {
+        return PointT(0, 0);
+    }
+    WorkspaceFrame* frame = GetFrame(0);
+    PointT snap;
+    frame->GetLMFrame()->GetGreatestSnapSize(snap);
+    if (snap.x == 0 || snap.y == 0) {
+        return PointT(0, 0);
+    }
+    frame->ConvertFrameToTabSizeIgnoreScrollbar(snap);
+    return snap;
+}
+
+bool TopLevelWindow::CanZoomToPreferredPanelSize() const {
+    return GetSingleWorkspaceFramePreferredTabSize() != PointT(0, 0);
+}
+
+bool TopLevelWindow::IsMegaZoomedToWindow() const {
+    if (main_ && GetPlatformWindow() && Desktop::Get().IsZoomed(GetPlatformWindow())) {
+        return true;
+    }
+    RectT outer = UI_GetGlobalStructureRect();
+    RectT monitor;
+    orvui::utility::MonitorInfo* monitors = workspace_ ? workspace_->ORV_GetMonitorInfo() : nullptr;
+    return monitors && monitors->GetMonitorRectFromRect(outer, monitor) && outer == monitor;
+}
+
+bool TopLevelWindow::IsMegaZoomedToPreferredSize() const {
+    PointT preferred = GetSingleWorkspaceFramePreferredTabSize();
+    if (preferred == PointT(0, 0)) {
+        return false;
+    }
+    RectT panel = GetFrame(0)->GetTabPanelRect();
+    return PointT(panel.width, panel.height) == preferred;
+}
+
+void TopLevelWindow::MegaZoom(MegaZoomType type, bool primary, RectT const* monitorRect) {
+    RectT monitor = monitorRect ? *monitorRect : GetMegaZoomMonitor(primary);
+    RectT outer = UI_GetGlobalStructureRect();
+    switch (type) {
+    case FitToMonitor:
+        UI_SetGlobalStructureRect(monitor);
+        break;
+    case ZoomContentToMonitor: {
+        RectT content;
+        if (HasSingleWorkspaceFrame()) {
+            WorkspaceFrame* frame = GetFrame(0);
+            content = frame->UI_LocalToGlobal(frame->GetTabPanelRect());
+            if (TabPanel* front = frame->GetFrontTabPanel()) {
+                TabPanel::MegaZoomContentTrim trim = front->GetMegaZoomContentTrim();
+                content = RectT(content.left + std::int32_t(trim.left), content.top + std::int32_t(trim.top),
+                                content.width - std::int32_t(trim.left + trim.right),
+                                content.height - std::int32_t(trim.top + trim.bottom));
+            }
+        }
+        if (content.width <= 0 || content.height <= 0) {
+            content = ClientRectInScreen();
+            if (main_) {
+                content.top -= Desktop::Get().GetMenuBarMetric();
+                content.height += Desktop::Get().GetMenuBarMetric();
+            }
+        }
+        // Push each side of the monitor outward by the chrome between the window's edge and the content.
+        std::int32_t left = monitor.left - (content.left - outer.left);
+        std::int32_t top = monitor.top - (content.top - outer.top);
+        std::int32_t right = monitor.Right() + (outer.Right() - content.Right());
+        std::int32_t bottom = monitor.Bottom() + (outer.Bottom() - content.Bottom());
+        UI_SetGlobalStructureRect(RectT(left, top, right - left, bottom - top));
+        break;
+    }
+    case ZoomToPreferredSize: {
+        PointT preferred = GetSingleWorkspaceFramePreferredTabSize();
+        if (preferred == PointT(0, 0)) {
+            return;
+        }
+        RectT panel = GetFrame(0)->UI_LocalToGlobal(GetFrame(0)->GetTabPanelRect());
+        std::int32_t width = preferred.x + (outer.width - panel.width);
+        std::int32_t height = preferred.y + orvui::controls::UI_TabWell::GetTabScrollbarHeight() +
+                              (outer.height - panel.height);
+        std::int32_t left = monitor.left + monitor.width / 2 - width / 2;
+        std::int32_t top = monitor.top + monitor.height / 2 - height / 2;
+        UI_SetGlobalStructureRect(RectT(left, top, width, height));
+        break;
+    }
+    }
+}
+
+void TopLevelWindow::MegaZoomToggle(bool primary) {
+    RectT monitor = GetMegaZoomMonitor(primary);
+    MegaZoomType next = FitToMonitor;
+    if (IsMegaZoomedToWindow()) {
+        next = ZoomContentToMonitor;
+    } else if (UI_GetGlobalStructureRect().Intersection(monitor) == monitor &&
+               !IsMegaZoomedToPreferredSize()) {
+        next = CanZoomToPreferredPanelSize() ? ZoomToPreferredSize : FitToMonitor;
+    }
+    MegaZoom(next, primary, &monitor);
 }
 
 // --- Toolkit ---

@@ -17,6 +17,7 @@
 
 namespace orvworkspace::workspace {
 
+class TablessWorkspaceFrame;
 class TabPanel;
 class Workspace;
 class WorkspaceFrame;
@@ -61,6 +62,7 @@ public:
     virtual boost::intrusive_ptr<WorkspaceFrame> CreateWorkspaceFrame(std::string const& tabType);
     virtual boost::intrusive_ptr<WorkspaceFrame> CreateWorkspaceFrame(RectT const& rect);
     virtual boost::intrusive_ptr<WorkspaceFrame> CreateWorkspaceFrame();
+    virtual boost::intrusive_ptr<TablessWorkspaceFrame> CreateTablessFrame(RectT const& rect);
     // Makes the frame the whole layout.
     virtual void SetRootFrame(boost::intrusive_ptr<WorkspaceFrame> frame, bool select);
     virtual WorkspaceFrame* CreateRootFrame(std::string const& tabType, bool select, bool show);
@@ -82,6 +84,7 @@ public:
     // Takes a frame out of the layout and the window; one that still holds hidden panels is kept hidden
     // when its place is kept.
     virtual void RemoveFrame(boost::intrusive_ptr<WorkspaceFrameBase> frame, bool keepPlace);
+    // A host's window answers true to offer mega zoom.
     virtual bool CanMegaZoom() const { return false; }
     bool UI_IsRootViewOpaque() const override;
 
@@ -101,6 +104,24 @@ public:
     void DestroyHiddenFrames();
     void RemoveTabPanels(bool flag);
     void DestroyTabPanels();
+
+    // --- Static elements: one panel in a tabless frame kept along a window edge ---
+    void SetStaticElement(boost::intrusive_ptr<TabPanel> const& panel, LayoutManager::InsertionType side,
+                          bool relayout);
+    TabPanel* SetStaticElement(std::string const& tabType, LayoutManager::InsertionType side, bool relayout);
+    TabPanel* GetStaticElement(LayoutManager::InsertionType side) const;
+    bool HasStaticElement(LayoutManager::InsertionType side) const;
+    void RemoveStaticElement(LayoutManager::InsertionType side, bool relayout);
+
+    // --- Mega zoom: the window made to fill a monitor ---
+    enum MegaZoomType { FitToMonitor = 0, ZoomContentToMonitor = 1, ZoomToPreferredSize = 2 };
+    // The primary monitor when asked for and present, else the monitor holding the window.
+    RectT GetMegaZoomMonitor(bool primary) const;
+    void MegaZoom(MegaZoomType type, bool primary, RectT const* monitor = nullptr);
+    // Cycles fit, content zoom, preferred size (when there is one), fit.
+    void MegaZoomToggle(bool primary);
+    bool IsMegaZoomedToWindow() const;
+    bool IsMegaZoomedToPreferredSize() const;
 
     // --- Edge drop zones ---
     // The hit (thin) or display rectangle of an edge zone in screen coordinates.
@@ -124,6 +145,13 @@ public:
     bool UI_WantsKeyboardFocus() const override { return false; }
     void UI_ActivationChanged(bool active) override;
     void UI_SizeChanged() override;
+
+protected:
+    TablessWorkspaceFrame* GetBorderFrame(LayoutManager::InsertionType side) const;
+    bool CanZoomToPreferredPanelSize() const;
+    // The single frame's preferred panel size; (0, 0) for the main window or several frames.
+    PointT GetSingleWorkspaceFramePreferredTabSize() const;
+    bool HasSingleWorkspaceFrame() const { return GetFrameCount() == 1; }
 
 private:
     RectT ClientRectInScreen() const;
