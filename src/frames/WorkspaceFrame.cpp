@@ -9,6 +9,7 @@
 #include "host/core/PropListUtils.h"
 #include "host/ui/Menu.h"
 #include "host/ui/NodeManager.h"
+#include "layout/Splitter.h"
 #include "workspace/TabCreator.h"
 #include "workspace/TabPanel.h"
 #include "workspace/TopLevelWindow.h"
@@ -743,6 +744,73 @@ void WorkspaceFrame::Undock(long index, bool wholeFrame) {
     }
     window->UI_Show(true);
     workspace->SetFocusedTabPanel(GetFrontTabPanel());
+}
+
+// --- Neighbours ---
+
+Frame* WorkspaceFrame::RecurseFindFirstVisibleFrame(Splitter* splitter, bool fromLeftOrTop,
+                                                    long& side) const {
+    if (!splitter) {
+        return nullptr;
+    }
+    LayoutManagerElement* first = fromLeftOrTop ? splitter->GetLeftOrTop() : splitter->GetRightOrBottom();
+    LayoutManagerElement* second = fromLeftOrTop ? splitter->GetRightOrBottom() : splitter->GetLeftOrTop();
+    Frame* found = nullptr;
+    for (LayoutManagerElement* child : {first, second}) {
+        Frame* frame = AsFrame(child);
+        if (frame && frame != GetLMFrame() && frame->IsFrameShown()) {
+            found = frame;
+            break;
+        }
+    }
+    for (LayoutManagerElement* child : {first, second}) {
+        if (found) {
+            break;
+        }
+        found = RecurseFindFirstVisibleFrame(AsSplitter(child), fromLeftOrTop, side);
+    }
+    if (found) {
+        bool horizontal = !splitter->IsVertical();
+        side = fromLeftOrTop ? (horizontal ? 3 : 4) : (horizontal ? 1 : 2);
+    }
+    return found;
+}
+
+void WorkspaceFrame::RecurseCountVisibleFrames(Splitter* splitter, long& count) const {
+    if (!splitter) {
+        return;
+    }
+    for (LayoutManagerElement* child : {splitter->GetLeftOrTop(), splitter->GetRightOrBottom()}) {
+        if (Frame* frame = AsFrame(child)) {
+            if (frame != GetLMFrame() && frame->IsFrameShown()) {
+                ++count;
+            }
+        } else {
+            RecurseCountVisibleFrames(AsSplitter(child), count);
+        }
+    }
+}
+
+WorkspaceFrame* WorkspaceFrame::GetNearestVisibleSibling(long& side) const {
+    Splitter* parent = GetLMFrame()->GetParent();
+    if (!parent || !GetTopLevelWindow()) {
+        return nullptr;
+    }
+    bool fromLeftOrTop = parent->GetLeftOrTop() == GetLMFrame();
+    Frame* found = RecurseFindFirstVisibleFrame(parent, fromLeftOrTop, side);
+    if (!found) {
+        return nullptr;
+    }
+    LayoutManagerElement* ownSide =
+        (side == 1 || side == 2) ? parent->GetRightOrBottom() : parent->GetLeftOrTop();
+    if (Splitter* crowded = AsSplitter(ownSide)) {
+        long count = 0;
+        RecurseCountVisibleFrames(crowded, count);
+        if (count > 1) {
+            return nullptr;
+        }
+    }
+    return GetTopLevelWindow()->GetFrameFromLMFrame(found);
 }
 
 void WorkspaceFrame::SetTabMargin(float margin) {

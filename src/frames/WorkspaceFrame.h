@@ -19,6 +19,8 @@ class OS_Menu;
 
 namespace orvworkspace::workspace {
 
+class Splitter;
+
 class WorkspaceFrame : public WorkspaceFrameBase {
 public:
     WorkspaceFrame(TopLevelWindow* window, RectT const& rect);
@@ -117,6 +119,15 @@ public:
     void DoTabMenuCommand(long index, unsigned long command);
     // Moves a tab's panel, or the whole frame, into a new floating window over the panel's place.
     void Undock(long index, bool wholeFrame);
+
+    // --- Neighbours in the split tree ---
+    // The first shown frame other than this one among the splitter's children, then in its child
+    // splitters, searched from the left or top side first when asked; side tells where it was found
+    // (fromLeftOrTop: 3 across a horizontal bar, 4 across a vertical one; otherwise 1 or 2).
+    Frame* RecurseFindFirstVisibleFrame(Splitter* splitter, bool fromLeftOrTop, long& side) const;
+    void RecurseCountVisibleFrames(Splitter* splitter, long& count) const;
+    // The nearest shown frame beside this one, or null.
+    WorkspaceFrame* GetNearestVisibleSibling(long& side) const;
 
     // The tab well's gestures.
     void HandleTabItemAction(int action, long index, RectT const* rect);

@@ -226,3 +226,25 @@ TEST_F(WindowFeatures, TheLibrarysImagesComeFromItsResources) {
     }
     EXPECT_FALSE(workspace->GetImage(Workspace::WorkspaceImage(7)));
 }
+
+TEST_F(WindowFeatures, TheNearestShownNeighbourIsFoundAcrossTheBars) {
+    BuildTwoFrames(); // editor | browser
+    WorkspaceFrame* bottom = main->AddTabbedFrame(right, "mixer", LayoutManager::Bottom);
+    long side = 0;
+    EXPECT_EQ(left->GetNearestVisibleSibling(side), right); // the first shown frame across the bar
+    EXPECT_EQ(side, 4);
+    EXPECT_EQ(bottom->GetNearestVisibleSibling(side), right);
+    EXPECT_EQ(side, 1);
+    EXPECT_EQ(right->GetNearestVisibleSibling(side), bottom);
+    EXPECT_EQ(side, 3);
+
+    long count = 0;
+    left->RecurseCountVisibleFrames(left->GetLMFrame()->GetParent(), count);
+    EXPECT_EQ(count, 2);
+    right->ShowFrame(false);
+    count = 0;
+    left->RecurseCountVisibleFrames(left->GetLMFrame()->GetParent(), count);
+    EXPECT_EQ(count, 1);
+    EXPECT_EQ(bottom->GetNearestVisibleSibling(side), nullptr);
+    EXPECT_EQ(left->GetNearestVisibleSibling(side), bottom);
+}
