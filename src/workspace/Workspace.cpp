@@ -334,18 +334,16 @@ void Workspace::ReLayoutTopLevelWindows() {
     }
 }
 
-void Workspace::RemoveTabPanels() {
+void Workspace::ForEachWindowWithLayoutOff(std::function<void(TopLevelWindow&)> const& action) {
     {
         LayoutDisabled disabled(*this);
+        // Held, because the action may take a window out of the workspace.
         std::vector<boost::intrusive_ptr<TopLevelWindow>> windows;
         for (TopLevelWindow* w : GetWindows()) {
             windows.emplace_back(w);
         }
         for (auto const& w : windows) {
-            w->RemoveTabPanels(false);
-            if (!w->IsMain()) {
-                w->UI_Show(false);
-            }
+            action(*w);
         }
         ClearRemovedWindowData();
     }
@@ -354,21 +352,17 @@ void Workspace::RemoveTabPanels() {
     }
 }
 
+void Workspace::RemoveTabPanels() {
+    ForEachWindowWithLayoutOff([](TopLevelWindow& w) {
+        w.RemoveTabPanels(false);
+        if (!w.IsMain()) {
+            w.UI_Show(false);
+        }
+    });
+}
+
 void Workspace::DestroyTabPanels() {
-    {
-        LayoutDisabled disabled(*this);
-        std::vector<boost::intrusive_ptr<TopLevelWindow>> windows;
-        for (TopLevelWindow* w : GetWindows()) {
-            windows.emplace_back(w);
-        }
-        for (auto const& w : windows) {
-            w->DestroyTabPanels();
-        }
-        ClearRemovedWindowData();
-    }
-    if (GetLayoutEnabled()) {
-        ReLayoutTopLevelWindows();
-    }
+    ForEachWindowWithLayoutOff([](TopLevelWindow& w) { w.DestroyTabPanels(); });
 }
 
 void Workspace::BringAppToFront() {

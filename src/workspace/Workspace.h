@@ -10,6 +10,7 @@
 #include "platform/OS_Tracker.h"
 #include "platform/OS_Workspace.h"
 
+#include <functional>
 #include <map>
 #include <memory>
 #include <string>
@@ -135,6 +136,8 @@ protected:
 
 private:
     struct LayoutDisabled;
+    // Runs the action on every window with layout off, forgets closed windows, then lays out again.
+    void ForEachWindowWithLayoutOff(std::function<void(TopLevelWindow&)> const& action);
 
     std::unique_ptr<OS_Tracker> tracker_;
     unsigned long freshTabTimeStamp_ = 0;

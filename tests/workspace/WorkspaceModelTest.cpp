@@ -393,3 +393,26 @@ TEST_F(WorkspaceModel, FloatingWindowsAreOwnedToolWindowsAtTheirRectangle) {
     workspace->MakeWindowPermanent(floating);
     EXPECT_FALSE(floating->IsInterim());
 }
+
+TEST_F(WorkspaceModel, ClearingTheWorkspaceTellsPanelsAndEmptiesEveryWindow) {
+    Register({"scope", MixerPaint, /*hides*/ true});
+    BuildTwoFrames();
+    auto floating = workspace->AddTopLevelWindow(false, nullptr);
+    floating->UI_Show(true);
+    floating->CreateRootFrame("mixer", true, true);
+    right->AddTab("scope", true);
+
+    workspace->RemoveTabPanels();
+    EXPECT_EQ(std::count(panelLog.begin(), panelLog.end(), "editor: window closing"), 1);
+    EXPECT_EQ(std::count(panelLog.begin(), panelLog.end(), "mixer: window closing"), 1);
+    EXPECT_EQ(main->GetFrameCount(), 0u);
+    EXPECT_TRUE(workspace->GetLayoutEnabled());
+    // The hiding panel is kept with its frame, out of the layout, to come back.
+    ASSERT_EQ(main->HiddenFrames().size(), 1u);
+    EXPECT_EQ(main->HiddenFrames().front()->HiddenTabs().size(), 1u);
+    EXPECT_FALSE(floating->UI_IsShown());
+
+    workspace->DestroyTabPanels();
+    EXPECT_TRUE(main->HiddenFrames().empty());
+    EXPECT_EQ(main->GetRootFrame(), nullptr);
+}
