@@ -32,7 +32,11 @@ TablessWorkspaceFrame::TablessWorkspaceFrame(TopLevelWindow* window, RectT const
     SetSizeAndPos(window->GetLayoutManager()->ConstructFrameZones(rect));
 }
 
-TablessWorkspaceFrame::~TablessWorkspaceFrame() = default;
+TablessWorkspaceFrame::~TablessWorkspaceFrame() {
+    if (panel_ && panel_->GetFrame() == this) {
+        panel_->SetFrame(nullptr);
+    }
+}
 
 UI_TablessDragger* TablessWorkspaceFrame::GetDragger() const {
     auto* dragger = dynamic_cast<UI_TablessDragger*>(ChildGet(0));

@@ -42,7 +42,21 @@ WorkspaceFrame::WorkspaceFrame(TopLevelWindow* window, RectT const& rect)
     ChildGet(1)->UI_Show(true);
 }
 
-WorkspaceFrame::~WorkspaceFrame() = default;
+WorkspaceFrame::~WorkspaceFrame() {
+    // Panels that outlive their frame (held by the host) must not point at it any more.
+    auto* container = ChildSize() > 1 ? dynamic_cast<TabPanelContainer*>(ChildGet(1)) : nullptr;
+    for (std::size_t i = 0; container && i < container->ChildSize(); ++i) {
+        if (auto* panel = dynamic_cast<TabPanel*>(container->ChildGet(i));
+            panel && panel->GetFrame() == this) {
+            panel->SetFrame(nullptr);
+        }
+    }
+    for (auto const& hidden : hiddenTabs_) {
+        if (hidden->GetFrame() == this) {
+            hidden->SetFrame(nullptr);
+        }
+    }
+}
 
 UI_TabWell* WorkspaceFrame::GetTabWell() const {
     auto* well = dynamic_cast<UI_TabWell*>(ChildGet(0));
@@ -272,10 +286,7 @@ void WorkspaceFrame::AddTabs(WorkspaceFrame* other) {
     removedTabData_.insert(removedTabData_.end(), other->removedTabData_.begin(),
                            other->removedTabData_.end());
     other->removedTabData_.clear();
-    for (auto const& hidden : other->hiddenTabs_) {
-        hidden->SetFrame(this);
-        hiddenTabs_.push_back(hidden);
-    }
+    hiddenTabs_.insert(hiddenTabs_.end(), other->hiddenTabs_.begin(), other->hiddenTabs_.end());
     other->hiddenTabs_.clear();
     std::vector<boost::intrusive_ptr<TabPanel>> moved;
     while (other->GetTabCount() > 0) {
@@ -296,8 +307,11 @@ boost::intrusive_ptr<TabPanel> WorkspaceFrame::DetachTabPanel(long index) {
     }
     panel->SetFrame(nullptr);
     UI_TabWell* well = GetTabWell();
+    // Taking out a tab behind the front one leaves the front panel in front (the well moves its
+    // index along); taking out the front tab brings the next one forward, or the previous one when
+    // it was the last.
     long front = well->GetFrontmost();
-    bool cleared = front >= index;
+    bool cleared = front == index;
     if (cleared) {
         well->SetFrontmost(-1);
     }
@@ -466,9 +480,15 @@ TabPanel* WorkspaceFrame::ReanimateTab(std::string const& tabType) {
         return nullptr;
     }
     std::string state = entry->second;
-    removedTabData_.erase(entry);
     TabPanel* panel = AddTab(tabType, true);
-    if (panel && !state.empty()) {
+    if (!panel) {
+        return nullptr; // no creator made one: the remembered state stays for a later try
+    }
+    auto used = std::find(removedTabData_.begin(), removedTabData_.end(), std::make_pair(tabType, state));
+    if (used != removedTabData_.end()) {
+        removedTabData_.erase(used);
+    }
+    if (!state.empty()) {
         orvcore::proplist::PropList list;
         try {
             orvcore::proplist::utils::ReadPropList(state, list);
@@ -721,11 +741,11 @@ void WorkspaceFrame::Undock(long index, bool wholeFrame) {
     RectT rect = panel->UI_GetGlobalRect();
     PointT snap;
     GetLMFrame()->GetGreatestSnapSize(snap);
-    if (snap.x != 0 || snap.y != 0) {
-        ConvertFrameToTabSize(snap);
-        rect.width = snap.x != 0 ? snap.x : rect.width;
-        rect.height = snap.y != 0 ? snap.y : rect.height;
-    }
+    // 0 means no wish in that direction; it is tested before converting, which would make it negative.
+    PointT converted = snap;
+    ConvertFrameToTabSize(converted);
+    rect.width = snap.x != 0 ? converted.x : rect.width;
+    rect.height = snap.y != 0 ? converted.y : rect.height;
     bool fromMain = source->IsMain();
     boost::intrusive_ptr<TopLevelWindow> window = workspace->AddTopLevelWindow(false, nullptr);
     if (wholeFrame) {
@@ -743,7 +763,8 @@ void WorkspaceFrame::Undock(long index, bool wholeFrame) {
         window->UI_Move(PointT(outer.left + 20, outer.top + 20));
     }
     window->UI_Show(true);
-    workspace->SetFocusedTabPanel(GetFrontTabPanel());
+    // The undocked panel (or the undocked frame's front panel) is what the user works with next.
+    workspace->SetFocusedTabPanel(wholeFrame ? GetFrontTabPanel() : panel.get());
 }
 
 // --- Neighbours ---
@@ -835,10 +856,14 @@ void WorkspaceFrame::UI_FocusChanged(int reason) {
 }
 
 bool WorkspaceFrame::UI_DoMouseEvent(UI_Node* target, MouseEvent& event) {
-    // Presses on the frame's own edges offer a splitter drag, which the dragging code provides.
-    (void)target;
-    (void)event;
-    return false;
+    if (target != this || !GetWorkspace()) {
+        return false;
+    }
+    // Anything but a move over the frame's own edges ends a drag left running.
+    if (!event.IsAction(action::Move) && GetWorkspace()->GetTracker()) {
+        GetWorkspace()->ReleaseTracker(false);
+    }
+    return GetWorkspace()->GetTracker() != nullptr;
 }
 
 } // namespace orvworkspace::workspace

@@ -135,7 +135,6 @@ public:
     void RestoreDefaultMargin();
 
     void UI_FocusChanged(int reason) override;
-    bool AllowFocusToAdvanceFromChildren() const override { return false; }
     bool UI_DoMouseEvent(orvui::ui::UI_Node* target, orvui::ui::MouseEvent& event) override;
 
 private:

@@ -67,6 +67,8 @@ public:
     virtual void DrawBorders(canvasor::Canvasor* c);
     void UI_Draw(canvasor::Canvasor& c) override;
     void UI_FocusChanged(int reason) override;
+    // Tab does not walk out of a frame into the next one.
+    bool AllowFocusToAdvanceFromChildren() const override { return false; }
 
 protected:
     RectT LocalToWindow(RectT const& r) const;

@@ -332,22 +332,43 @@ bool TopLevelWindow::ReanimateFrame(std::string const& tabType) {
     if (!proxy) {
         return false;
     }
-    boost::intrusive_ptr<WorkspaceFrame> frame;
+    auto found = hiddenFrames_.end();
     if (proxy->HasFrame()) {
-        auto found = std::find_if(hiddenFrames_.begin(), hiddenFrames_.end(),
-                                  [&](auto const& f) { return f->GetLMFrame() == proxy->GetFrame(); });
-        if (found != hiddenFrames_.end()) {
-            frame = *found;
-            hiddenFrames_.erase(found);
-            ChildPushBack(frame);
+        found = std::find_if(hiddenFrames_.begin(), hiddenFrames_.end(),
+                             [&](auto const& f) { return f->GetLMFrame() == proxy->GetFrame(); });
+    }
+    boost::intrusive_ptr<WorkspaceFrame> frame = found != hiddenFrames_.end() ? *found : nullptr;
+    // What comes back is settled before the frame returns to the layout, so that a frame never
+    // comes back empty: a hidden panel of the type, else one made again from its remembered state.
+    boost::intrusive_ptr<TabPanel> hiddenPanel;
+    if (frame) {
+        for (auto const& panel : frame->HiddenTabs()) {
+            if (panel->GetTabType() == tabType) {
+                hiddenPanel = panel;
+                break;
+            }
         }
     }
-    if (!frame) {
+    TabDataList const& remembered = frame ? frame->GetRemovedTabData() : proxy->GetTabData();
+    bool canMake =
+        workspace_ && workspace_->FindCreator(tabType) &&
+        std::any_of(remembered.begin(), remembered.end(), [&](auto const& e) { return e.first == tabType; });
+    if (!hiddenPanel && !canMake) {
+        return false;
+    }
+    if (frame) {
+        hiddenFrames_.erase(found);
+        ChildPushBack(frame);
+    } else {
         frame = CreateWorkspaceFrame();
         frame->SetRemovedTabData(proxy->GetTabData());
     }
     layoutManager_->ReanimateFrame(proxy, frame->GetLMFrame());
-    frame->ReanimateTab(tabType);
+    if (hiddenPanel) {
+        frame->ReanimateTab(hiddenPanel);
+    } else {
+        frame->ReanimateTab(tabType);
+    }
     layoutManager_->LayoutNewFrame(frame->GetLMFrame());
     frame->UI_Invalidate();
     frame->ShowFrame(true);

@@ -90,13 +90,15 @@ bool Workspace::ChildRequestRemove(boost::intrusive_ptr<UI_Node> node) {
     if (!window || window->IsMain()) {
         return true;
     }
-    window->RemoveTabPanels(true);
+    // Ask first: a window that stays must not have lost panels on the way.
     for (std::size_t i = 0; i < window->ChildSize(); ++i) {
         auto* frame = dynamic_cast<WorkspaceFrame*>(window->ChildGet(i));
         if (frame && !frame->AllowFrameClose()) {
             return false;
         }
     }
+    boost::intrusive_ptr<TopLevelWindow> keep(window->IsReferenced() ? window : nullptr);
+    window->RemoveTabPanels(true);
     if (window->UI_GetParentNode()) {
         return UI_Container::ChildRequestRemove(node);
     }
@@ -154,9 +156,11 @@ bool Workspace::RemoveTab(WorkspaceFrame* frame, long index, bool cacheData, boo
     boost::intrusive_ptr<UI_Node> keepFrame(frame->IsReferenced() ? frame : nullptr);
     boost::intrusive_ptr<TopLevelWindow> window(frame->GetTopLevelWindow());
     bool hadFocus = frame->UI_HasKeyboardFocus(false) || frame->UI_HasKeyboardFocus(true);
+    bool obliterated = false;
     if (honourObliterate) {
         if (TabPanel* panel = frame->GetTabPanel(index); panel && panel->ObliterateWhenClosed()) {
             NotifyObliterating(panel);
+            obliterated = true;
             cacheData = cacheData && panel->SaveStateWhenObliterated();
         }
     }
@@ -165,7 +169,8 @@ bool Workspace::RemoveTab(WorkspaceFrame* frame, long index, bool cacheData, boo
         return false;
     }
     if (cacheData) {
-        frame->CacheTabData(panel, panel->HideWhenClosed());
+        // A panel announced as destroyed is remembered by its type and state, never kept alive.
+        frame->CacheTabData(panel, panel->HideWhenClosed() && !obliterated);
     }
     // A frame that still has tabs has already focused its new front panel when it held the focus;
     // moving the focus to the window's root frame from there would take it away from where the user

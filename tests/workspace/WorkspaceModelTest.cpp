@@ -243,8 +243,12 @@ TEST_F(WorkspaceModel, DetachingTabsKeepsASensibleFrontTab) {
     frame->AddTabs(std::vector<boost::intrusive_ptr<TabPanel>>{last});
     frame->AddTab("editor", true);
     frame->BringTabToFront(2);
+    TabPanel* shown = frame->GetFrontTabPanel();
+    // Closing a tab behind the front one does not change what the user is looking at.
     frame->DetachTabPanel(0);
-    EXPECT_EQ(frame->GetFrontTabIndex(), 2);
+    EXPECT_EQ(frame->GetFrontTabIndex(), 1);
+    EXPECT_EQ(frame->GetFrontTabPanel(), shown);
+    EXPECT_TRUE(shown->UI_IsShown());
     EXPECT_EQ(frame->GetTabCount(), 3);
     EXPECT_EQ(frame->DetachTabPanel(9), nullptr);
 }
@@ -271,6 +275,7 @@ TEST_F(WorkspaceModel, MovingAFramesTabsKeepsTheirOrderAndAppendsWhatItRemembers
     ASSERT_EQ(right->HiddenTabs().size(), 2u);
     EXPECT_EQ(right->HiddenTabs().front(), ownHidden);
     EXPECT_EQ(right->HiddenTabs().back().get(), scope);
+    EXPECT_TRUE(right->ReanimateTab(right->HiddenTabs().back()));
     EXPECT_EQ(scope->GetFrame(), right);
     EXPECT_FALSE(left->HasRemovedTabData() || left->HasHiddenTabs());
 }
@@ -415,4 +420,66 @@ TEST_F(WorkspaceModel, ClearingTheWorkspaceTellsPanelsAndEmptiesEveryWindow) {
     workspace->DestroyTabPanels();
     EXPECT_TRUE(main->HiddenFrames().empty());
     EXPECT_EQ(main->GetRootFrame(), nullptr);
+}
+
+TEST_F(WorkspaceModel, APanelAnnouncedAsDestroyedIsNeverKeptHidden) {
+    Register({"probe", MixerPaint, /*hides*/ true, /*obliterates*/ true});
+    Register({"logger", MixerPaint, /*hides*/ true, /*obliterates*/ true, /*savesState*/ true});
+    BuildTwoFrames();
+    boost::intrusive_ptr<TabPanel> probe(right->AddTab("probe", true));
+    ASSERT_TRUE(workspace->RemoveTab(right, probe.get(), true, true));
+    EXPECT_FALSE(right->HasHiddenTabs());
+    EXPECT_FALSE(right->HasRemovedTabData());
+    EXPECT_EQ(probe->GetFrame(), nullptr);
+
+    right->AddTab("logger", true);
+    ASSERT_TRUE(workspace->RemoveTab(right, 1L, true, true));
+    EXPECT_FALSE(right->HasHiddenTabs());
+    ASSERT_EQ(right->GetRemovedTabData().size(), 1u);
+    EXPECT_EQ(right->GetRemovedTabData()[0].first, "logger");
+    EXPECT_EQ(workspace->log, (std::vector<std::string>{"obliterating probe", "obliterating logger"}));
+}
+
+TEST_F(WorkspaceModel, AWindowThatRefusesToCloseKeepsAllItsPanels) {
+    Register({"render", MixerPaint, false, /*obliterates*/ true});
+    auto floating = workspace->AddTopLevelWindow(false, nullptr);
+    WorkspaceFrame* frame = floating->CreateRootFrame("render", true, true);
+    Painted(frame->AddTab("mixer", true))->allowClose = false;
+    EXPECT_FALSE(workspace->RemoveWindow(floating.get(), true));
+    EXPECT_EQ(TabTypes(frame), (std::vector<std::string>{"render", "mixer"}));
+    EXPECT_TRUE(workspace->log.empty());
+}
+
+TEST_F(WorkspaceModel, ReopeningWithoutACreatorChangesNothing) {
+    BuildTwoFrames();
+    right->AddRemovedTabData("gone", "");
+    EXPECT_EQ(right->ReanimateTab("gone"), nullptr);
+    EXPECT_TRUE(right->CanReanimateTab("gone")); // the state waits for a creator
+
+    // A closed frame whose panel type lost its creator does not come back empty.
+    ASSERT_TRUE(workspace->RemoveTab(right, 0L, true, true));
+    std::unique_ptr<TabCreator> browserCreator(workspace->FindCreator("browser"));
+    workspace->UnregisterTabCreator("browser");
+    EXPECT_FALSE(main->ReanimateFrame("browser"));
+    EXPECT_EQ(main->GetFrameCount(), 1u);
+    workspace->RegisterTabCreator(browserCreator.release());
+    EXPECT_TRUE(main->ReanimateFrame("browser"));
+    EXPECT_EQ(main->GetFrameCount(), 2u);
+}
+
+TEST_F(WorkspaceModel, PanelsThatOutliveTheirFrameForgetIt) {
+    BuildTwoFrames();
+    boost::intrusive_ptr<TabPanel> held(right->GetFrontTabPanel());
+    boost::intrusive_ptr<TabPanel> bar(
+        workspace->FindCreator("mixer")->CreateTabPanel(workspace.get(), nullptr));
+    main->SetStaticElement(bar, LayoutManager::Top, true);
+    ASSERT_NE(bar->GetFrame(), nullptr);
+    main->RemoveStaticElement(LayoutManager::Top, true);
+    EXPECT_EQ(bar->GetFrame(), nullptr);
+    bar->SetName(u"renamed"); // reaches no frame
+
+    main->RemoveFrame(boost::intrusive_ptr<WorkspaceFrameBase>(right), false);
+    right = nullptr;
+    EXPECT_EQ(held->GetFrame(), nullptr);
+    held->SetTabColor(canvasor::ColorRGBA(1, 0, 0, 1));
 }

@@ -75,6 +75,20 @@ unsigned long Cmd(WorkspaceFrame::FlyoutCommand c) {
     return WorkspaceFrame::CommandNumber(c);
 }
 
+// A panel that asks the layout for given sizes.
+class SizedPanel : public PaintedPanel {
+public:
+    SizedPanel(Workspace* ws, std::vector<PointT> sizes)
+        : PaintedPanel(ws, nullptr, "sized", MixerPaint, nullptr)
+        , snapSizes_(std::move(sizes)) {}
+
+private:
+    void DoGetSnapSizes(std::vector<PointT>& out) const override {
+        out.insert(out.end(), snapSizes_.begin(), snapSizes_.end());
+    }
+    std::vector<PointT> snapSizes_;
+};
+
 // A panel with an item of its own in the flyout menu, which it counts when chosen.
 class PanelWithCommands : public PaintedPanel {
 public:
@@ -134,6 +148,19 @@ TEST_F(WorkspaceScenario, TheFlyoutMenuUndocksAPanelIntoANewFloatingWindow) {
     EXPECT_EQ(mixer->UI_GetGlobalRect(), before);
     EXPECT_EQ(right->GetTabCount(), 1);
     EXPECT_FALSE(right->HasRemovedTabData());
+    EXPECT_EQ(workspace->GetFocusedTabPanel(), mixer);
+}
+
+TEST_F(WorkspaceScenario, AnUndockedPanelWithAHeightOnlyWishKeepsItsWidth) {
+    boost::intrusive_ptr<TabPanel> strip(new SizedPanel(workspace.get(), {PointT(0, 120)}));
+    right->AddTab(strip, true);
+    RectT before = strip->UI_GetGlobalRect();
+    right->Undock(2, false);
+    ASSERT_EQ(workspace->GetWindows().size(), 2u);
+    RectT after = strip->UI_GetGlobalRect();
+    EXPECT_EQ(after.width, before.width);
+    EXPECT_EQ(after.height, 120);
+    EXPECT_EQ(after.left, before.left);
 }
 
 TEST_F(WorkspaceScenario, TheFlyoutMenuUndocksAndClosesWholeFrames) {
