@@ -853,6 +853,12 @@ void WorkspaceFrame::UI_FocusChanged(int reason) {
     GetTabWell()->SetFocusedLook(UI_HasKeyboardFocus(true));
     GetTabWell()->InvalidateDueToFocusChange();
     WorkspaceFrameBase::UI_FocusChanged(reason);
+    // The frame itself has nothing to type into: focus given to it goes on to its front panel.
+    if (UI_HasKeyboardFocus(false)) {
+        if (TabPanel* front = GetFrontTabPanel()) {
+            front->UI_GainKeyboardFocus(reason);
+        }
+    }
 }
 
 bool WorkspaceFrame::UI_DoMouseEvent(UI_Node* target, MouseEvent& event) {

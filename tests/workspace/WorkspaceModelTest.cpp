@@ -483,3 +483,12 @@ TEST_F(WorkspaceModel, PanelsThatOutliveTheirFrameForgetIt) {
     EXPECT_EQ(held->GetFrame(), nullptr);
     held->SetTabColor(canvasor::ColorRGBA(1, 0, 0, 1));
 }
+
+TEST_F(WorkspaceModel, FocusGivenToAFrameGoesOnToItsFrontPanel) {
+    BuildTwoFrames();
+    workspace->SetFocusedTabPanel(left->GetFrontTabPanel());
+    right->UI_GainKeyboardFocus(orvui::ui::FocusByProgram);
+    EXPECT_EQ(workspace->GetFocusedTabPanel(), right->GetFrontTabPanel());
+    EXPECT_TRUE(right->GetTabWell()->GetFocusedLook());
+    EXPECT_FALSE(left->GetTabWell()->GetFocusedLook());
+}
