@@ -12,7 +12,7 @@ namespace orvworkspace::workspace {
 using namespace orvui::ui;
 
 TabPanel::TabPanel(Workspace* workspace, WorkspaceFrameBase* frame, bool wantsKeyboardFocus,
-                   std::string tabType, std::u16string const& name, OSEventFunction, bool)
+                   std::string tabType, std::u16string const& name, OSEventFunction osEventFunc, bool)
     : id_(workspace ? workspace->NewUniqueID() : 0)
     , tabType_(std::move(tabType))
     , wantsKeyboardFocus_(wantsKeyboardFocus)
@@ -22,6 +22,9 @@ TabPanel::TabPanel(Workspace* workspace, WorkspaceFrameBase* frame, bool wantsKe
     RectT rect = frame ? frame->GetTabPanelRect() : RectT();
     ConstructOSWindow(frame ? frame->GetPlatformWindow() : 0, rect);
     UI_SetNodeID(tabType_);
+    if (osEventFunc) {
+        UI_SetEventFunction(osEventFunc);
+    }
     if (frame && workspace) {
         touchStamp_ = workspace->FreshTabTimeStamp();
     }

@@ -25,7 +25,7 @@ namespace {
 bool activating = false;
 } // namespace
 
-TopLevelWindow::TopLevelWindow(Workspace* workspace, OSEventFunction, bool flag)
+TopLevelWindow::TopLevelWindow(Workspace* workspace, OSEventFunction osEventFunc, bool flag)
     : OS_TopLevelWindow(workspace, flag)
     , interim_(false)
     , main_(true)
@@ -33,11 +33,14 @@ TopLevelWindow::TopLevelWindow(Workspace* workspace, OSEventFunction, bool flag)
     , workspace_(workspace) {
     UI_SetNodeID("TopLevelWindow");
     ConstructOSWindow();
+    if (osEventFunc) {
+        UI_SetEventFunction(osEventFunc);
+    }
     layoutManager_->SetContainingRect(ClientLocalRect());
 }
 
-TopLevelWindow::TopLevelWindow(Workspace* workspace, bool interim, RectT const* rect, OSEventFunction,
-                               bool flag)
+TopLevelWindow::TopLevelWindow(Workspace* workspace, bool interim, RectT const* rect,
+                               OSEventFunction osEventFunc, bool flag)
     : OS_TopLevelWindow(workspace, flag)
     , interim_(interim)
     , main_(false)
@@ -46,6 +49,9 @@ TopLevelWindow::TopLevelWindow(Workspace* workspace, bool interim, RectT const* 
     UI_SetNodeID("TopLevelWindow");
     TopLevelWindow* owner = workspace ? workspace->GetMainTopLevelWindow() : nullptr;
     ConstructOSWindow(owner ? owner->GetPlatformWindow() : 0, rect ? *rect : DefaultRect);
+    if (osEventFunc) {
+        UI_SetEventFunction(osEventFunc);
+    }
     layoutManager_->SetContainingRect(ClientLocalRect());
 }
 

@@ -177,3 +177,33 @@ TEST_F(Platform, LosingTheCaptureOrCancellingEndsTheTrackerCancelled) {
     EXPECT_EQ(trackLog.back(), "end");
     EXPECT_EQ(workspace->GetTracker(), nullptr);
 }
+
+namespace {
+std::vector<std::pair<NativeWindow, unsigned>> hostMessages;
+void HostEventFunction(orvui::ui::OS_Event* event) {
+    hostMessages.emplace_back(event->window, event->message);
+}
+bool Saw(NativeWindow w, unsigned message) {
+    return std::find(hostMessages.begin(), hostMessages.end(), std::make_pair(w, message)) !=
+           hostMessages.end();
+}
+} // namespace
+
+TEST_F(Platform, AHostsEventFunctionSeesTheMessagesOfItsWindowsAndPanels) {
+    hostMessages.clear();
+    boost::intrusive_ptr<TopLevelWindow> floating(
+        new TopLevelWindow(workspace.get(), false, nullptr, &HostEventFunction, false));
+    workspace->ChildPushBack(floating);
+    Desktop::Get().SendMessage(floating->GetPlatformWindow(), orvui::ui::message::Enable, 1, 0);
+    EXPECT_TRUE(Saw(floating->GetPlatformWindow(), orvui::ui::message::Enable));
+
+    WorkspaceFrame* frame = floating->CreateRootFrame("editor", true, true);
+    boost::intrusive_ptr<TabPanel> panel(
+        new TabPanel(workspace.get(), frame, true, "plain", u"Plain", &HostEventFunction, false));
+    frame->AddTab(panel, true);
+    Desktop::Get().SendMessage(panel->GetPlatformWindow(), orvui::ui::message::MouseMove, 0, 0);
+    EXPECT_TRUE(Saw(panel->GetPlatformWindow(), orvui::ui::message::MouseMove));
+    // Windows made without one are not watched.
+    Desktop::Get().SendMessage(main->GetPlatformWindow(), orvui::ui::message::Enable, 1, 0);
+    EXPECT_FALSE(Saw(main->GetPlatformWindow(), orvui::ui::message::Enable));
+}

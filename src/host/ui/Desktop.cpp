@@ -149,7 +149,8 @@ void Desktop::SetParent(NativeWindow child, NativeWindow parent) {
         return;
     }
     if (NativeWindowRecord* old = Find(record->parent)) {
-        old->children.erase(std::remove(old->children.begin(), old->children.end(), child), old->children.end());
+        old->children.erase(std::remove(old->children.begin(), old->children.end(), child),
+                            old->children.end());
     }
     record->parent = parent;
     if (parent) {
@@ -562,6 +563,9 @@ std::intptr_t Desktop::SendMessage(NativeWindow w, unsigned msg, std::uintptr_t 
     event.message = msg;
     event.wParam = wParam;
     event.lParam = lParam;
+    if (OS_Window::EventFunction hook = object->UI_GetEventFunction()) {
+        hook(&event);
+    }
     object->UI_HandleOSEvent(event);
     return event.result;
 }

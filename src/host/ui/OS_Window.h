@@ -26,6 +26,10 @@ public:
     // Unbinds the native window, which lives on without this object; returns it.
     NativeWindow UI_DetachOSWindow();
     NativeWindow GetPlatformWindow() const { return window_; }
+    // A host's hook that sees every message sent to the native window before the window handles it.
+    using EventFunction = void (*)(OS_Event*);
+    void UI_SetEventFunction(EventFunction function) { eventFunction_ = function; }
+    EventFunction UI_GetEventFunction() const { return eventFunction_; }
     // The toolkit object of a native window, or null.
     static OS_Window* FromNative(NativeWindow window);
 
@@ -61,6 +65,7 @@ public:
     void UI_ParentChanged() override;
 
 private:
+    EventFunction eventFunction_ = nullptr;
     NativeWindow window_ = 0;
 };
 
