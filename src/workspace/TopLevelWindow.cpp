@@ -3,6 +3,7 @@
 
 #include "frames/TablessWorkspaceFrame.h"
 #include "frames/WorkspaceFrame.h"
+#include "host/core/Error.h"
 #include "host/ui/MonitorInfo.h"
 #include "host/ui/NodeManager.h"
 #include "host/ui/ResourceManager.h"
@@ -763,8 +764,13 @@ bool TopLevelWindow::UI_DoCursor(PointF local) {
     default:
         return false;
     }
-    if (workspace_) {
-        workspace_->GetResourceManager()->SetCursor(cursorNumber);
+    try {
+        if (workspace_) {
+            workspace_->GetResourceManager()->SetCursor(cursorNumber);
+        }
+    } catch (orvcore::config::Error const&) {
+        // A host without resources still gets the splitter cursors.
+        Desktop::Get().SetCursor(cursorNumber);
     }
     return true;
 }

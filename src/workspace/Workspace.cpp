@@ -399,6 +399,14 @@ orvui::utility::ResourceManager* Workspace::GetResourceManager() const {
     return resourceManager_.get();
 }
 
+void Workspace::SetResourceManager(std::unique_ptr<orvui::utility::ResourceManager> manager) {
+    resourceManager_ = std::move(manager);
+    for (int i = 0; i < 3; ++i) {
+        images_[i] = nullptr;
+        imagesLoaded_[i] = false;
+    }
+}
+
 canvasor::FileImageP Workspace::GetImage(WorkspaceImage image) const {
     int index = int(image);
     if (index < 0 || index > 2) {

@@ -129,6 +129,8 @@ public:
     canvasor::FileImageP GetImage(WorkspaceImage image) const;
     // The library's resources; raises UnableToAccessResource when there are none.
     orvui::utility::ResourceManager* GetResourceManager() const;
+    // A host may supply its own resources (or none); images are looked up again.
+    void SetResourceManager(std::unique_ptr<orvui::utility::ResourceManager> manager);
     void DrawDockProgress(int, int) {}
 
 protected:

@@ -4,6 +4,8 @@
 
 #include "frames/TablessWorkspaceFrame.h"
 #include "frames/WorkspaceBorderElement.h"
+#include "host/core/Error.h"
+#include "host/ui/ResourceManager.h"
 #include "host/ui/controls/TabWell.h"
 
 using namespace orvtest;
@@ -247,4 +249,23 @@ TEST_F(WindowFeatures, TheNearestShownNeighbourIsFoundAcrossTheBars) {
     EXPECT_EQ(count, 1);
     EXPECT_EQ(bottom->GetNearestVisibleSibling(side), nullptr);
     EXPECT_EQ(left->GetNearestVisibleSibling(side), bottom);
+}
+
+TEST_F(WindowFeatures, AWorkspaceWithoutResourcesSaysSoAndKeepsWorking) {
+    BuildTwoFrames();
+    workspace->SetResourceManager(nullptr);
+    try {
+        workspace->GetResourceManager();
+        ADD_FAILURE() << "no error without resources";
+    } catch (orvcore::config::Error const& e) {
+        EXPECT_EQ(e.Facility(), 105);
+        EXPECT_EQ(e.Code(), 20);
+    }
+    EXPECT_FALSE(workspace->GetImage(Workspace::CloseBox));
+
+    // The bar between the frames still shows its cursor.
+    RectT l = left->UI_GetGlobalRect();
+    RectT r = right->UI_GetGlobalRect();
+    Desktop::Get().MouseMove(PointT((l.Right() + r.left) / 2, l.top + l.height / 2));
+    EXPECT_EQ(Desktop::Get().GetCursor(), orvui::ui::cursor::VerticalSplitter);
 }
