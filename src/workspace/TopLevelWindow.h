@@ -101,6 +101,8 @@ public:
     bool ReanimateFrame(boost::intrusive_ptr<TabPanel> const& panel);
     std::list<boost::intrusive_ptr<WorkspaceFrame>> const& HiddenFrames() const { return hiddenFrames_; }
     void AddHiddenFrame(boost::intrusive_ptr<WorkspaceFrame> const& frame);
+    // Hands the hidden frames to the caller and forgets them (a restore replaces them).
+    std::list<boost::intrusive_ptr<WorkspaceFrame>> TakeHiddenFrames() { return std::move(hiddenFrames_); }
     void DestroyHiddenFrames();
     void RemoveTabPanels(bool flag);
     void DestroyTabPanels();
