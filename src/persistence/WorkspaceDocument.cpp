@@ -114,8 +114,11 @@ void SaveSplitter(Splitter const& splitter, PropList& list, bool framesAsProxies
     }
 }
 
+} // namespace
+
 // --- Restoring ---
 
+namespace {
 // Takes a panel out of whatever held it before the restore: a frame's tabs or a tabless frame.
 void Unplace(TabPanel& panel) {
     if (auto* frame = dynamic_cast<WorkspaceFrame*>(panel.GetFrame())) {
@@ -130,6 +133,8 @@ void Unplace(TabPanel& panel) {
     }
 }
 
+} // namespace
+
 boost::intrusive_ptr<TabPanel> TakeOrCreateTabPanel(Workspace& workspace, std::string const& type,
                                                     ReusableTabPool& pool, WorkspaceFrameBase* frame) {
     auto found =
@@ -143,6 +148,8 @@ boost::intrusive_ptr<TabPanel> TakeOrCreateTabPanel(Workspace& workspace, std::s
     TabCreator* creator = workspace.FindCreator(type);
     return creator ? creator->CreateTabPanel(&workspace, frame) : nullptr;
 }
+
+namespace {
 
 void LoadState(TabPanel& panel, std::string const& state) {
     if (state.empty()) {
@@ -456,31 +463,21 @@ void RestoreTopLevelWindow(TopLevelWindow& window, PropList const& list, Reusabl
 
 ReusableTabPool CollectReusableTabs(Workspace& workspace) {
     ReusableTabPool pool;
-    std::set<TabPanel*> seen;
-    auto add = [&](TabPanel* panel) {
-        if (panel && panel->IsReferenced() && seen.insert(panel).second) {
-            pool.emplace_back(panel);
-        }
-    };
     for (TopLevelWindow* window : workspace.GetWindows()) {
         for (std::size_t i = 0; i < window->ChildSize(); ++i) {
             if (auto* frame = dynamic_cast<WorkspaceFrameBase*>(window->ChildGet(i))) {
                 for (long t = 0; t < frame->GetTabCount(); ++t) {
-                    add(frame->GetTabPanel(t));
+                    if (TabPanel* panel = frame->GetTabPanel(t); panel && panel->IsReferenced()) {
+                        pool.emplace_back(panel);
+                    }
                 }
-            }
-            if (auto* frame = dynamic_cast<WorkspaceFrame*>(window->ChildGet(i))) {
-                for (auto const& hidden : frame->HiddenTabs()) {
-                    add(hidden.get());
-                }
-            }
-        }
-        for (auto const& frame : window->HiddenFrames()) {
-            for (auto const& hidden : frame->HiddenTabs()) {
-                add(hidden.get());
             }
         }
     }
+    workspace.FindAllHiddenTabs(pool);
+    // A panel kept by a closed-window record may also sit in a frame's list; each is pooled once.
+    std::set<TabPanel*> seen;
+    pool.remove_if([&](auto const& panel) { return !seen.insert(panel.get()).second; });
     return pool;
 }
 
@@ -500,6 +497,7 @@ void SaveWorkspace(Workspace& workspace, PropList& list, std::u16string const& u
         ++count;
     }
     list.SetValue("SerCfgMax", count);
+    workspace.SaveWorkspaceData(*list.NewSubList("WSInstanceData"));
 }
 
 bool IsCompatibleVersion(PropList const& list) {
@@ -563,6 +561,9 @@ bool RestoreWorkspace(Workspace& workspace, PropList const& list, bool restoreMa
         if (!window->IsMain() && window->GetFrameCount() == 0) {
             existing.push_back(window);
         }
+    }
+    if (PropList const* instance = list.GetSubList("WSInstanceData")) {
+        workspace.ReadWorkspaceData(*instance, pool);
     }
     for (auto const& window : existing) {
         if (window->IsMain()) {

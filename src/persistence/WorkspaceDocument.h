@@ -27,6 +27,7 @@ class Splitter;
 class TabPanel;
 class TopLevelWindow;
 class Workspace;
+class WorkspaceFrameBase;
 
 using ReusableTabPool = std::list<boost::intrusive_ptr<TabPanel>>;
 
@@ -47,6 +48,10 @@ void SaveTopLevelWindow(TopLevelWindow& window, orvcore::proplist::PropList& lis
 void RestoreTopLevelWindow(TopLevelWindow& window, orvcore::proplist::PropList const& list,
                            ReusableTabPool& pool, bool restoreBounds, bool restoreMaximizedFrame,
                            bool forceRelayout);
+// A panel of the type: the first of the pool (taken out of its old place), else a new one from the
+// type's creator; null when there is none.
+boost::intrusive_ptr<TabPanel> TakeOrCreateTabPanel(Workspace& workspace, std::string const& type,
+                                                    ReusableTabPool& pool, WorkspaceFrameBase* frame);
 // Every panel of the workspace now: in frames, static bars and hidden tabs, in window order.
 ReusableTabPool CollectReusableTabs(Workspace& workspace);
 

@@ -4,10 +4,15 @@
 #include "frames/WorkspaceFrame.h"
 #include "host/core/Error.h"
 #include "host/core/ErrorTable.h"
+#include "host/core/PropList.h"
+#include "host/core/PropListUtils.h"
 #include "host/ui/MonitorInfo.h"
 #include "host/ui/NodeManager.h"
 #include "host/ui/ResourceManager.h"
 #include "host/ui/canvasor/SupplierInterface.h"
+#include "layout/FrameDataProxy.h"
+#include "layout/Splitter.h"
+#include "persistence/WorkspaceDocument.h"
 #include "workspace/TabCreator.h"
 #include "workspace/TabPanel.h"
 #include "workspace/TopLevelWindow.h"
@@ -90,6 +95,9 @@ bool Workspace::ChildRequestRemove(boost::intrusive_ptr<UI_Node> node) {
     if (!window || window->IsMain()) {
         return true;
     }
+    if (windowsBeingRemoved_.count(window)) {
+        return true; // emptied by its own removal: the outer request finishes it
+    }
     // Ask first: a window that stays must not have lost panels on the way.
     for (std::size_t i = 0; i < window->ChildSize(); ++i) {
         auto* frame = dynamic_cast<WorkspaceFrame*>(window->ChildGet(i));
@@ -98,7 +106,13 @@ bool Workspace::ChildRequestRemove(boost::intrusive_ptr<UI_Node> node) {
         }
     }
     boost::intrusive_ptr<TopLevelWindow> keep(window->IsReferenced() ? window : nullptr);
+    bool record = recordRemovedWindows_;
+    windowsBeingRemoved_.insert(window);
     window->RemoveTabPanels(true);
+    if (record) {
+        removedWindowData_.push_back(new WindowReanimateData(*window));
+    }
+    windowsBeingRemoved_.erase(window);
     if (window->UI_GetParentNode()) {
         return UI_Container::ChildRequestRemove(node);
     }
@@ -380,6 +394,220 @@ void Workspace::BringAppToFront() {
     }
     main->UI_Activate();
     main->UI_UpdateNow(~0u);
+}
+
+// --- Closed windows ---
+
+namespace {
+void TakeOutOfTree(TabPanel& panel) {
+    panel.SetFrame(nullptr);
+    panel.UI_SetParent(nullptr);
+}
+} // namespace
+
+Workspace::WindowReanimateData::WindowReanimateData(TopLevelWindow& window) {
+    std::vector<LayoutManagerElement*> pending;
+    if (Splitter* root = window.GetLayoutManager()->GetRootSplitter()) {
+        pending.push_back(root);
+    }
+    while (!pending.empty()) {
+        LayoutManagerElement* e = pending.back();
+        pending.pop_back();
+        if (Splitter* s = AsSplitter(e)) {
+            // Right or bottom pushed first, so the left or top side is walked first.
+            for (LayoutManagerElement* child : {s->GetRightOrBottom(), s->GetLeftOrTop()}) {
+                if (child) {
+                    pending.push_back(child);
+                }
+            }
+            continue;
+        }
+        TabDataList visible, removed, hidden;
+        if (FrameDataProxy* proxy = AsPlaceholder(e)) {
+            visible = proxy->GetTabData();
+        } else if (Frame* frame = AsFrame(e)) {
+            frame->GetTabData(visible, removed, hidden);
+        }
+        for (TabDataList const* group : {&visible, &removed, &hidden}) {
+            for (auto const& entry : *group) {
+                tabTypes.insert(entry.first);
+            }
+        }
+    }
+    orvcore::proplist::PropList description;
+    SaveTopLevelWindow(window, description, true);
+    description.OutputAsXMLFragment(windowXml);
+
+    auto keepFrom = [&](WorkspaceFrame& frame) {
+        for (long i = 0; i < frame.GetTabCount();) {
+            if (frame.GetTabPanel(i)->HideWhenClosed()) {
+                hiddenPanels.push_back(frame.DetachTabPanel(i));
+            } else {
+                ++i;
+            }
+        }
+        hiddenPanels.insert(hiddenPanels.end(), frame.HiddenTabs().begin(), frame.HiddenTabs().end());
+    };
+    for (std::size_t i = 0; i < window.ChildSize(); ++i) {
+        if (auto* frame = dynamic_cast<WorkspaceFrame*>(window.ChildGet(i))) {
+            keepFrom(*frame);
+        }
+    }
+    for (auto const& frame : window.HiddenFrames()) {
+        keepFrom(*frame);
+    }
+    for (auto const& panel : hiddenPanels) {
+        TakeOutOfTree(*panel);
+    }
+}
+
+Workspace::WindowReanimateData::~WindowReanimateData() = default;
+
+Workspace::WindowReanimateData::WindowReanimateData(Workspace& workspace,
+                                                    orvcore::proplist::PropList const& list,
+                                                    std::list<boost::intrusive_ptr<TabPanel>>& pool) {
+    std::vector<std::string> types;
+    list.GetValue("RemovedTabs", types);
+    tabTypes.insert(types.begin(), types.end());
+    list.GetValue("WinSerData", windowXml);
+    std::vector<std::string> hiddenList;
+    list.GetValue("HiddenTabs", hiddenList);
+    std::set<std::string> hiddenTypes(hiddenList.begin(), hiddenList.end());
+    TopLevelWindow* main = workspace.GetMainTopLevelWindow();
+    if (hiddenTypes.empty() || !main) {
+        return;
+    }
+    boost::intrusive_ptr<WorkspaceFrame> scratch = main->CreateWorkspaceFrame(RectT());
+    for (std::string const& type : hiddenTypes) {
+        if (boost::intrusive_ptr<TabPanel> panel =
+                TakeOrCreateTabPanel(workspace, type, pool, scratch.get())) {
+            TakeOutOfTree(*panel);
+            hiddenPanels.push_back(panel);
+        }
+    }
+    main->ChildRemove(scratch.get());
+}
+
+bool Workspace::CanReanimateWindow(std::string const& tabType) const {
+    return std::any_of(removedWindowData_.begin(), removedWindowData_.end(),
+                       [&](WindowReanimateDataP const& r) { return r->tabTypes.count(tabType) != 0; });
+}
+
+bool Workspace::CanReanimateWindow(boost::intrusive_ptr<TabPanel> const& panel) const {
+    return std::any_of(
+        removedWindowData_.begin(), removedWindowData_.end(), [&](WindowReanimateDataP const& r) {
+            return std::find(r->hiddenPanels.begin(), r->hiddenPanels.end(), panel) != r->hiddenPanels.end();
+        });
+}
+
+bool Workspace::RebuildWindow(WindowReanimateData const& record,
+                              std::function<void(TopLevelWindow&)> const& bringBack) {
+    orvcore::proplist::PropList description;
+    try {
+        orvcore::proplist::utils::ReadPropList(record.windowXml, description);
+    } catch (orvcore::config::Error const&) {
+        return false; // a damaged description cannot be rebuilt; the record stays as it was
+    }
+    boost::intrusive_ptr<TopLevelWindow> window =
+        AddTopLevelWindow(GetMainTopLevelWindow() == nullptr, nullptr);
+    ReusableTabPool pool(record.hiddenPanels.begin(), record.hiddenPanels.end());
+    RestoreTopLevelWindow(*window, description, pool, true, false, false);
+    bringBack(*window);
+    return true;
+}
+
+bool Workspace::ReanimateWindow(std::string const& tabType) {
+    for (auto it = removedWindowData_.begin(); it != removedWindowData_.end(); ++it) {
+        WindowReanimateDataP record = *it;
+        if (!record->tabTypes.count(tabType)) {
+            continue;
+        }
+        bool rebuilt = RebuildWindow(*record, [&](TopLevelWindow& window) {
+            if (!window.ReanimateFrame(tabType)) {
+                window.CreateRootFrame(tabType, true, false);
+            }
+        });
+        if (rebuilt) {
+            removedWindowData_.remove(record);
+            return true;
+        }
+    }
+    return false;
+}
+
+bool Workspace::ReanimateWindow(boost::intrusive_ptr<TabPanel> const& panel) {
+    for (auto it = removedWindowData_.begin(); it != removedWindowData_.end(); ++it) {
+        WindowReanimateDataP record = *it;
+        if (std::find(record->hiddenPanels.begin(), record->hiddenPanels.end(), panel) ==
+            record->hiddenPanels.end()) {
+            continue;
+        }
+        bool rebuilt = RebuildWindow(*record, [&](TopLevelWindow& window) {
+            if (!window.CanReanimateFrame(panel) || !window.ReanimateFrame(panel)) {
+                window.CreateRootFrame(panel, true);
+            }
+        });
+        if (rebuilt) {
+            removedWindowData_.remove(record);
+            return true;
+        }
+    }
+    return false;
+}
+
+void Workspace::FindAllHiddenTabs(std::list<boost::intrusive_ptr<TabPanel>>& out) {
+    auto gather = [&](WorkspaceFrame& frame) {
+        for (auto const& panel : frame.HiddenTabs()) {
+            panel->UI_SetParent(nullptr);
+            out.push_back(panel);
+        }
+        frame.DestroyHiddenTabs();
+    };
+    for (TopLevelWindow* window : GetWindows()) {
+        for (std::size_t i = 0; i < window->ChildSize(); ++i) {
+            if (auto* frame = dynamic_cast<WorkspaceFrame*>(window->ChildGet(i))) {
+                gather(*frame);
+            }
+        }
+        for (auto const& frame : window->HiddenFrames()) {
+            gather(*frame);
+        }
+    }
+    for (auto const& record : removedWindowData_) {
+        for (auto const& panel : record->hiddenPanels) {
+            panel->UI_SetParent(nullptr);
+            out.push_back(panel);
+        }
+    }
+}
+
+void Workspace::SaveWorkspaceData(orvcore::proplist::PropList& list) const {
+    std::int32_t i = 0;
+    for (auto const& record : removedWindowData_) {
+        orvcore::proplist::PropList* out = list.NewSubList("FrameReanim-" + std::to_string(i++));
+        out->SetValue("RemovedTabs",
+                      std::vector<std::string>(record->tabTypes.begin(), record->tabTypes.end()));
+        out->SetValue("WinSerData", record->windowXml);
+        std::set<std::string> hiddenTypes;
+        for (auto const& panel : record->hiddenPanels) {
+            hiddenTypes.insert(panel->GetTabType());
+        }
+        out->SetValue("HiddenTabs", std::vector<std::string>(hiddenTypes.begin(), hiddenTypes.end()));
+    }
+    list.SetValue("FrameReanimMax", i);
+}
+
+void Workspace::ReadWorkspaceData(orvcore::proplist::PropList const& list,
+                                  std::list<boost::intrusive_ptr<TabPanel>>& pool) {
+    removedWindowData_.clear();
+    std::int32_t count = 0;
+    list.GetValue("FrameReanimMax", count);
+    for (std::int32_t i = 0; i < count; ++i) {
+        // A count naming a record that is not there skips it.
+        if (orvcore::proplist::PropList const* entry = list.GetSubList("FrameReanim-" + std::to_string(i))) {
+            removedWindowData_.push_back(new WindowReanimateData(*this, *entry, pool));
+        }
+    }
 }
 
 // --- Drawing and resources ---

@@ -10,14 +10,20 @@
 #include "platform/OS_Tracker.h"
 #include "platform/OS_Workspace.h"
 
+#include <boost/smart_ptr/intrusive_ref_counter.hpp>
 #include <functional>
+#include <list>
 #include <map>
 #include <memory>
+#include <set>
 #include <string>
 #include <vector>
 
 namespace canvasor {
 class SupplierInterface;
+}
+namespace orvcore::proplist {
+class PropList;
 }
 namespace orvui::utility {
 class MonitorInfo;
@@ -33,6 +39,25 @@ class WorkspaceFrame;
 
 class Workspace : public OS_Workspace {
 public:
+    // The memory of one closed floating window: the tab types its layout held, its description with
+    // every frame as a placeholder, and the panels kept alive because their type hides when closed.
+    class WindowReanimateData : public boost::intrusive_ref_counter<WindowReanimateData> {
+    public:
+        // Remembers a window that is being removed (its hiding panels are taken out of it).
+        WindowReanimateData(TopLevelWindow& window);
+        // Reads a record of the workspace's instance data, taking kept panels from the pool.
+        WindowReanimateData(Workspace& workspace, orvcore::proplist::PropList const& list,
+                            std::list<boost::intrusive_ptr<TabPanel>>& pool);
+        ~WindowReanimateData();
+        WindowReanimateData(WindowReanimateData const&) = delete;
+        WindowReanimateData& operator=(WindowReanimateData const&) = delete;
+
+        std::set<std::string> tabTypes;
+        std::list<boost::intrusive_ptr<TabPanel>> hiddenPanels;
+        std::string windowXml;
+    };
+    using WindowReanimateDataP = boost::intrusive_ptr<WindowReanimateData>;
+
     enum WorkspaceImage { CloseBox = 0, Gripper = 1, DownArrow = 2 };
 
     explicit Workspace(canvasor::SupplierInterface* supplier = nullptr);
@@ -117,7 +142,20 @@ public:
     void ReLayoutTopLevelWindows();
     void RemoveTabPanels();
     void DestroyTabPanels();
-    void ClearRemovedWindowData() {}
+    // --- Closed windows ---
+    void ClearRemovedWindowData() { removedWindowData_.clear(); }
+    std::list<WindowReanimateDataP> const& GetRemovedWindowData() const { return removedWindowData_; }
+    bool CanReanimateWindow(std::string const& tabType) const;
+    bool CanReanimateWindow(boost::intrusive_ptr<TabPanel> const& panel) const;
+    // Rebuilds the first remembered window that held the type (or the panel); true when one came back.
+    bool ReanimateWindow(std::string const& tabType);
+    bool ReanimateWindow(boost::intrusive_ptr<TabPanel> const& panel);
+    // Every kept panel: hidden tabs of frames and hidden frames (taken from them), then those of the
+    // closed-window records (which keep them too).
+    void FindAllHiddenTabs(std::list<boost::intrusive_ptr<TabPanel>>& out);
+    void SaveWorkspaceData(orvcore::proplist::PropList& list) const;
+    void ReadWorkspaceData(orvcore::proplist::PropList const& list,
+                           std::list<boost::intrusive_ptr<TabPanel>>& pool);
     void BringAppToFront();
 
     // --- Drawing and resources ---
@@ -154,6 +192,11 @@ private:
     mutable canvasor::FileImageP images_[3];
     mutable bool imagesLoaded_[3] = {false, false, false};
     bool recordRemovedWindows_ = true;
+    std::list<WindowReanimateDataP> removedWindowData_;
+    // Windows whose removal is under way; a nested request for one of them leaves it to the outer one.
+    std::set<TopLevelWindow*> windowsBeingRemoved_;
+    bool RebuildWindow(WindowReanimateData const& record,
+                       std::function<void(TopLevelWindow&)> const& bringBack);
     std::unique_ptr<orvui::utility::ResourceManager> resourceManager_;
     static inline bool dragTabSoundFeedbackEnabled = false;
 };

@@ -80,6 +80,8 @@ TEST_F(WorkspaceDocument, ASmallWorkspaceIsWrittenKeyByKey) {
     tabs->SetValue("ReanimTabs", std::vector<std::string>{"scope"});
     tabs->SetValue("HidTabState-0", std::string("<prop.list/>"));
 
+    expected.NewSubList("WSInstanceData")->SetValue("FrameReanimMax", std::int32_t(0));
+
     EXPECT_TRUE(doc == expected) << Xml(doc) << "\n-- expected --\n" << Xml(expected);
     EXPECT_EQ(GetWorkspaceUserName(doc), u"Editing");
     EXPECT_TRUE(IsCompatibleVersion(doc));
