@@ -394,6 +394,18 @@ void RestoreTopLevelWindow(TopLevelWindow& window, PropList const& list, Reusabl
     }
     UI_NodeManager::GroupingFocusChanges grouping;
     boost::intrusive_ptr<TopLevelWindow> keep(window.IsReferenced() ? &window : nullptr);
+    // The window is painted once, after the restore, not after every step of rebuilding it.
+    struct RedrawsSuspended {
+        TopLevelWindow& window;
+        explicit RedrawsSuspended(TopLevelWindow& w)
+            : window(w) {
+            window.SuspendRedraws(true);
+        }
+        ~RedrawsSuspended() {
+            window.SuspendRedraws(false);
+            window.UI_Invalidate();
+        }
+    } suspended(window);
     std::vector<std::int32_t> sz;
     list.GetValue("SzPos", sz);
     sz.resize(4, 0);

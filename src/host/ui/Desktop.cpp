@@ -99,10 +99,13 @@ void Desktop::DestroyNativeWindow(NativeWindow w) {
         siblings.erase(std::remove(siblings.begin(), siblings.end(), w), siblings.end());
     }
     zOrder_.erase(std::remove(zOrder_.begin(), zOrder_.end(), w), zOrder_.end());
-    // Windows it owned lose their owner, as the platform would leave them.
-    for (auto& entry : records_) {
-        if (entry.second.owner == w) {
-            entry.second.owner = 0;
+    // Windows it owned lose their owner, as the platform would leave them. Child windows own none,
+    // and skipping the walk for them keeps tearing down a frame tree linear.
+    if (!(record->style & style::Child)) {
+        for (auto& entry : records_) {
+            if (entry.second.owner == w) {
+                entry.second.owner = 0;
+            }
         }
     }
     if (capture_ == w) {

@@ -38,7 +38,12 @@ float GetFrontmostFocusedStrokeSize() {
 // --- Items ---
 
 float UI_TabItem::WantedLength() const {
-    float text = canvasor::Canvasor::Measure(orvcore::utility::UTF16to8(name), canvasor::Font()).width;
+    if (measuredWidth_ < 0 || measuredName_ != name) {
+        measuredWidth_ =
+            canvasor::Canvasor::Measure(orvcore::utility::UTF16to8(name), canvasor::Font()).width;
+        measuredName_ = name;
+    }
+    float text = measuredWidth_;
     return 2 * Padding + text + (canClose ? CloseLength : 0) + (lockable ? LockLength : 0) +
            (multiTab ? MultiLength : 0);
 }

@@ -68,6 +68,11 @@ public:
     RectF MultiTabRect() const;
     // The length the item wants along the well.
     float WantedLength() const;
+
+private:
+    // Measuring text is the costly part of arranging a well; the width is kept until the name changes.
+    mutable std::u16string measuredName_;
+    mutable float measuredWidth_ = -1.0f;
 };
 
 // The flyout at the end of a well: a gripper to drag the whole frame and a menu button.

@@ -1,0 +1,148 @@
+// Saving and restoring a workspace of 16 to 1024 tabbed frames (two tabs each) on the headless
+// desktop: as a property-list document in memory (restoring into the same workspace, so every panel
+// comes back from the reuse pool) and as a file. Prints microseconds and document bytes (medians of
+// five repetitions) and how save plus restore grows from 256 to 1024 frames.
+#include "MedianCollector.h"
+#include "frames/WorkspaceFrame.h"
+#include "host/core/PropList.h"
+#include "host/core/PropListUtils.h"
+#include "host/ui/Desktop.h"
+#include "persistence/WorkspaceDocument.h"
+#include "workspace/TabCreator.h"
+#include "workspace/TabPanel.h"
+#include "workspace/TopLevelWindow.h"
+#include "workspace/Workspace.h"
+
+#include <benchmark/benchmark.h>
+#include <cstdio>
+#include <deque>
+#include <filesystem>
+#include <map>
+
+using namespace orvworkspace::workspace;
+using orvcore::proplist::PropList;
+using orvui::ui::Desktop;
+
+namespace {
+
+class PlainPanelCreator : public TabCreator {
+public:
+    explicit PlainPanelCreator(std::string type)
+        : TabCreator(std::move(type)) {}
+    boost::intrusive_ptr<TabPanel> CreateTabPanel(Workspace* ws, WorkspaceFrameBase* frame) const override {
+        return new TabPanel(ws, frame, true, tabType, u"Plain");
+    }
+};
+
+// A main window on a 4K monitor with n frames of two tabs each, split off one another.
+class BenchWorkspace {
+public:
+    explicit BenchWorkspace(int n) {
+        Desktop::Reset();
+        Desktop::Get().SetMonitors({RectT(0, 0, 3840, 2160)});
+        namespace style = orvui::ui::style;
+        app = Desktop::Get().CreateNativeWindow(
+            u"Bench", style::Popup | style::Caption | style::SizingFrame | style::Visible, 0, 0,
+            RectT(0, 0, 3840, 2160));
+        workspace = new Workspace;
+        workspace->RegisterTabCreator(new PlainPanelCreator("first"));
+        workspace->RegisterTabCreator(new PlainPanelCreator("second"));
+        workspace->AttachToClientApp(nullptr, nullptr, app, nullptr, false);
+        TopLevelWindow* main = workspace->GetMainTopLevelWindow();
+        std::deque<WorkspaceFrame*> toSplit{main->CreateRootFrame("first", false, true)};
+        toSplit.front()->AddTab("second", false);
+        std::deque<int> depth{0};
+        for (int i = 1; i < n; ++i) {
+            WorkspaceFrame* beside = toSplit.front();
+            int d = depth.front();
+            toSplit.pop_front();
+            depth.pop_front();
+            WorkspaceFrame* added =
+                main->AddTabbedFrame(beside, "first", d % 2 ? LayoutManager::Bottom : LayoutManager::Right);
+            added->AddTab("second", false);
+            toSplit.insert(toSplit.end(), {beside, added});
+            depth.insert(depth.end(), {d + 1, d + 1});
+        }
+        frames = main->GetFrameCount();
+    }
+    ~BenchWorkspace() {
+        workspace.reset();
+        Desktop::Reset();
+    }
+
+    orvui::ui::NativeWindow app = 0;
+    boost::intrusive_ptr<Workspace> workspace;
+    unsigned long frames = 0;
+};
+
+std::map<int, std::size_t> documentBytes;
+
+void BM_SaveAndRestore(benchmark::State& state) {
+    int n = int(state.range(0));
+    BenchWorkspace bench(n);
+    if (bench.frames != static_cast<unsigned long>(n)) {
+        state.SkipWithError("the layout refused frames");
+        return;
+    }
+    for (auto _ : state) {
+        PropList doc;
+        SaveWorkspace(*bench.workspace, doc, u"Bench");
+        RestoreWorkspace(*bench.workspace, doc, true, true, false);
+    }
+    PropList doc;
+    SaveWorkspace(*bench.workspace, doc, u"Bench");
+    documentBytes[n] = orvcore::proplist::utils::DocumentText(doc).size();
+}
+
+void BM_SaveAndRestoreFile(benchmark::State& state) {
+    int n = int(state.range(0));
+    BenchWorkspace bench(n);
+    std::filesystem::path file = std::filesystem::temp_directory_path() / "orv-document-bench.xml";
+    std::string s = file.string();
+    std::u16string path(s.begin(), s.end());
+    for (auto _ : state) {
+        PropList doc;
+        SaveWorkspace(*bench.workspace, doc, u"Bench");
+        orvcore::proplist::utils::SavePropList(path, doc);
+        PropList loaded;
+        orvcore::proplist::utils::LoadPropList(path, loaded, true);
+        RestoreWorkspace(*bench.workspace, loaded, true, true, false);
+    }
+    std::filesystem::remove(file);
+}
+
+BENCHMARK(BM_SaveAndRestore)
+    ->RangeMultiplier(4)
+    ->Range(16, 1024)
+    ->Repetitions(5)
+    ->ReportAggregatesOnly(true)
+    ->Unit(benchmark::kMicrosecond);
+BENCHMARK(BM_SaveAndRestoreFile)
+    ->RangeMultiplier(4)
+    ->Range(16, 1024)
+    ->Repetitions(5)
+    ->ReportAggregatesOnly(true)
+    ->Unit(benchmark::kMicrosecond);
+
+} // namespace
+
+int main(int argc, char** argv) {
+    benchmark::Initialize(&argc, argv);
+    orvbench::MedianCollector reporter;
+    benchmark::RunSpecifiedBenchmarks(&reporter);
+    auto us = [&](char const* kind, int n) {
+        return reporter.Seconds(std::string(kind) + "/" + std::to_string(n)) * 1e6;
+    };
+    std::printf("\nsave + restore, microseconds (median) and document bytes:\n");
+    for (int n : {16, 64, 256, 1024}) {
+        std::printf("  %5d frames: document %10.1f us, file %10.1f us, %9zu bytes\n", n,
+                    us("BM_SaveAndRestore", n), us("BM_SaveAndRestoreFile", n), documentBytes[n]);
+    }
+    std::printf("256 frames, document: %.2f ms (target at most 9)\n", us("BM_SaveAndRestore", 256) / 1e3);
+    if (us("BM_SaveAndRestore", 256) > 0) {
+        std::printf("document(1024) / document(256): %.2f (linear is 4)\n",
+                    us("BM_SaveAndRestore", 1024) / us("BM_SaveAndRestore", 256));
+    }
+    benchmark::Shutdown();
+    return 0;
+}
