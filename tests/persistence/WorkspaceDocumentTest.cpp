@@ -299,3 +299,39 @@ TEST_F(WorkspaceDocument, HostileDocumentsRestoreWithoutHarm) {
     EXPECT_EQ(workspace->GetWindows().size(), 1u);
     EXPECT_EQ(main->GetFrameCount(), 0u);
 }
+
+TEST_F(WorkspaceDocument, StaticBarsAreSavedByTypeAndPanelsNobodyNamesAreOrphaned) {
+    BuildTwoFrames();
+    main->SetStaticElement("mixer", LayoutManager::Top, true);
+    PropList doc;
+    SaveWorkspace(*workspace, doc, u"");
+    PropList const* window = doc.GetSubList("TopLevelFrame-0");
+    bool has = false;
+    std::string type;
+    ASSERT_TRUE(window->GetValue("HasToolBar", has) && has);
+    ASSERT_TRUE(window->GetValue("ToolBarTabType", type));
+    EXPECT_EQ(type, "mixer");
+    EXPECT_FALSE(window->HasKey("StatBarTabType"));
+    // Only the two tabbed frames are in the tree.
+    std::string xml = Xml(*window);
+    std::size_t frames = 0;
+    for (std::size_t at = xml.find("<key>Frame</key>"); at != std::string::npos;
+         at = xml.find("<key>Frame</key>", at + 1)) {
+        ++frames;
+    }
+    EXPECT_EQ(frames, 2u);
+
+    // A document without the browser frame: the browser panel is orphaned, and so is the old bar's
+    // panel, the bar coming back with a new one of its type.
+    PropList* split =
+        doc.GetSubList("TopLevelFrame-0")->GetSubList("Splitter")->GetSubList("Sub1")->GetSubList("Splitter");
+    split->RemoveValue("Sub2");
+    split->SetValue("Sub2Vis", false);
+    workspace->log.clear();
+    ASSERT_TRUE(RestoreWorkspace(*workspace, doc, true, false, false));
+    EXPECT_EQ(workspace->log, (std::vector<std::string>{"pre-orphaning browser", "pre-orphaning mixer",
+                                                        "orphaning browser", "orphaning mixer"}));
+    EXPECT_EQ(main->GetFrameCount(), 1u);
+    ASSERT_TRUE(main->HasStaticElement(LayoutManager::Top));
+    EXPECT_EQ(main->GetStaticElement(LayoutManager::Top)->GetTabType(), "mixer");
+}

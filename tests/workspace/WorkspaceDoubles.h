@@ -84,6 +84,10 @@ public:
     void NotifyObliterating(TabPanel* panel) override {
         log.push_back("obliterating " + panel->GetTabType());
     }
+    void NotifyPreOrphaning(TabPanel* panel) override {
+        log.push_back("pre-orphaning " + panel->GetTabType());
+    }
+    void NotifyOrphaning(TabPanel* panel) override { log.push_back("orphaning " + panel->GetTabType()); }
     std::vector<std::string> log;
 };
 
