@@ -2,20 +2,16 @@
 // desktop: as a property-list document in memory (restoring into the same workspace, so every panel
 // comes back from the reuse pool) and as a file. Prints microseconds and document bytes (medians of
 // five repetitions) and how save plus restore grows from 256 to 1024 frames.
+#include "BenchWorkspace.h"
 #include "MedianCollector.h"
-#include "frames/WorkspaceFrame.h"
 #include "host/core/PropList.h"
 #include "host/core/PropListUtils.h"
 #include "host/ui/Desktop.h"
 #include "persistence/WorkspaceDocument.h"
-#include "workspace/TabCreator.h"
-#include "workspace/TabPanel.h"
-#include "workspace/TopLevelWindow.h"
 #include "workspace/Workspace.h"
 
 #include <benchmark/benchmark.h>
 #include <cstdio>
-#include <deque>
 #include <filesystem>
 #include <map>
 
@@ -23,63 +19,15 @@ using namespace orvworkspace::workspace;
 using orvcore::proplist::PropList;
 using orvui::ui::Desktop;
 
+using orvbench::BenchWorkspace;
+
 namespace {
-
-class PlainPanelCreator : public TabCreator {
-public:
-    explicit PlainPanelCreator(std::string type)
-        : TabCreator(std::move(type)) {}
-    boost::intrusive_ptr<TabPanel> CreateTabPanel(Workspace* ws, WorkspaceFrameBase* frame) const override {
-        return new TabPanel(ws, frame, true, tabType, u"Plain");
-    }
-};
-
-// A main window on a 4K monitor with n frames of two tabs each, split off one another.
-class BenchWorkspace {
-public:
-    explicit BenchWorkspace(int n) {
-        Desktop::Reset();
-        Desktop::Get().SetMonitors({RectT(0, 0, 3840, 2160)});
-        namespace style = orvui::ui::style;
-        app = Desktop::Get().CreateNativeWindow(
-            u"Bench", style::Popup | style::Caption | style::SizingFrame | style::Visible, 0, 0,
-            RectT(0, 0, 3840, 2160));
-        workspace = new Workspace;
-        workspace->RegisterTabCreator(new PlainPanelCreator("first"));
-        workspace->RegisterTabCreator(new PlainPanelCreator("second"));
-        workspace->AttachToClientApp(nullptr, nullptr, app, nullptr, false);
-        TopLevelWindow* main = workspace->GetMainTopLevelWindow();
-        std::deque<WorkspaceFrame*> toSplit{main->CreateRootFrame("first", false, true)};
-        toSplit.front()->AddTab("second", false);
-        std::deque<int> depth{0};
-        for (int i = 1; i < n; ++i) {
-            WorkspaceFrame* beside = toSplit.front();
-            int d = depth.front();
-            toSplit.pop_front();
-            depth.pop_front();
-            WorkspaceFrame* added =
-                main->AddTabbedFrame(beside, "first", d % 2 ? LayoutManager::Bottom : LayoutManager::Right);
-            added->AddTab("second", false);
-            toSplit.insert(toSplit.end(), {beside, added});
-            depth.insert(depth.end(), {d + 1, d + 1});
-        }
-        frames = main->GetFrameCount();
-    }
-    ~BenchWorkspace() {
-        workspace.reset();
-        Desktop::Reset();
-    }
-
-    orvui::ui::NativeWindow app = 0;
-    boost::intrusive_ptr<Workspace> workspace;
-    unsigned long frames = 0;
-};
 
 std::map<int, std::size_t> documentBytes;
 
 void BM_SaveAndRestore(benchmark::State& state) {
     int n = int(state.range(0));
-    BenchWorkspace bench(n);
+    BenchWorkspace bench(n, {"first", "second"});
     if (bench.frames != static_cast<unsigned long>(n)) {
         state.SkipWithError("the layout refused frames");
         return;
@@ -96,7 +44,7 @@ void BM_SaveAndRestore(benchmark::State& state) {
 
 void BM_SaveAndRestoreFile(benchmark::State& state) {
     int n = int(state.range(0));
-    BenchWorkspace bench(n);
+    BenchWorkspace bench(n, {"first", "second"});
     std::filesystem::path file = std::filesystem::temp_directory_path() / "orv-document-bench.xml";
     std::string s = file.string();
     std::u16string path(s.begin(), s.end());

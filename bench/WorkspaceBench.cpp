@@ -2,74 +2,23 @@
 // panel each, split into a balanced tree) on the headless desktop: the window is resized through
 // the desktop, as a user's drag of its border would, and every frame, tab well and panel follows.
 // Prints milliseconds per resize (medians of five repetitions) and how they grow from 256 to 1024.
+#include "BenchWorkspace.h"
 #include "MedianCollector.h"
-#include "frames/WorkspaceFrame.h"
 #include "host/ui/Desktop.h"
-#include "workspace/TabCreator.h"
-#include "workspace/TabPanel.h"
-#include "workspace/TopLevelWindow.h"
 #include "workspace/Workspace.h"
 
 #include <benchmark/benchmark.h>
 #include <cstdio>
-#include <deque>
 
 using namespace orvworkspace::workspace;
 using orvui::ui::Desktop;
 
+using orvbench::BenchWorkspace;
+
 namespace {
 
-class PlainPanelCreator : public TabCreator {
-public:
-    PlainPanelCreator()
-        : TabCreator("plain") {}
-    boost::intrusive_ptr<TabPanel> CreateTabPanel(Workspace* ws, WorkspaceFrameBase* frame) const override {
-        return new TabPanel(ws, frame, true, "plain", u"Plain");
-    }
-};
-
-// A main window on a 4K monitor with n frames, each split off an existing one so the tree stays
-// balanced.
-class BenchWorkspace {
-public:
-    explicit BenchWorkspace(int n) {
-        Desktop::Reset();
-        Desktop::Get().SetMonitors({RectT(0, 0, 3840, 2160)});
-        namespace style = orvui::ui::style;
-        app = Desktop::Get().CreateNativeWindow(
-            u"Bench", style::Popup | style::Caption | style::SizingFrame | style::Visible, 0, 0, Large);
-        workspace = new Workspace;
-        workspace->RegisterTabCreator(new PlainPanelCreator);
-        workspace->AttachToClientApp(nullptr, nullptr, app, nullptr, false);
-        TopLevelWindow* main = workspace->GetMainTopLevelWindow();
-        std::deque<WorkspaceFrame*> toSplit{main->CreateRootFrame("plain", false, true)};
-        std::deque<int> depth{0};
-        for (int i = 1; i < n; ++i) {
-            WorkspaceFrame* beside = toSplit.front();
-            int d = depth.front();
-            toSplit.pop_front();
-            depth.pop_front();
-            WorkspaceFrame* added =
-                main->AddTabbedFrame(beside, "plain", d % 2 ? LayoutManager::Bottom : LayoutManager::Right);
-            toSplit.insert(toSplit.end(), {beside, added});
-            depth.insert(depth.end(), {d + 1, d + 1});
-        }
-        frames = main->GetFrameCount();
-    }
-    ~BenchWorkspace() {
-        workspace.reset();
-        Desktop::Reset();
-    }
-
-    static constexpr RectT Large{0, 0, 3840, 2160};
-    static constexpr RectT Smaller{0, 0, 3600, 2000};
-    orvui::ui::NativeWindow app = 0;
-    boost::intrusive_ptr<Workspace> workspace;
-    unsigned long frames = 0;
-};
-
 void BM_ResizeMainWindow(benchmark::State& state) {
-    BenchWorkspace bench(int(state.range(0)));
+    BenchWorkspace bench(int(state.range(0)), {"plain"});
     if (bench.frames != static_cast<unsigned long>(state.range(0))) {
         state.SkipWithError("the layout refused frames");
         return;
