@@ -67,6 +67,21 @@ TEST_F(DesktopTest, OwnedWindowsStayAboveTheirOwner) {
     EXPECT_EQ(desktop().GetOwner(tool->GetPlatformWindow()), owner->GetPlatformWindow());
 }
 
+TEST_F(DesktopTest, AWindowOwnedThroughAChildIsOwnedByItsTopLevelWindow) {
+    auto owner = MakeWindow(RectT(0, 0, 400, 300));
+    NativeWindow child = desktop().CreateNativeWindow(u"child", style::Child | style::Visible, 0,
+                                                      owner->GetPlatformWindow(), RectT(10, 10, 50, 50));
+    NativeWindow popup =
+        desktop().CreateNativeWindow(u"popup", style::Popup, 0, child, RectT(20, 20, 30, 30));
+    EXPECT_EQ(desktop().GetOwner(popup), owner->GetPlatformWindow());
+    desktop().DestroyNativeWindow(child);
+    EXPECT_EQ(desktop().GetOwner(popup), owner->GetPlatformWindow());
+    NativeWindow ownerWindow = owner->GetPlatformWindow();
+    owner.reset(); // destroys its native window
+    EXPECT_FALSE(desktop().IsWindow(ownerWindow));
+    EXPECT_EQ(desktop().GetOwner(popup), 0u);
+}
+
 TEST_F(DesktopTest, PressActivatesWithCaptionAndApplicationMessages) {
     auto a = MakeWindow(RectT(0, 0, 400, 300));
     auto b = MakeWindow(RectT(500, 0, 400, 300));

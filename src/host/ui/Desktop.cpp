@@ -71,7 +71,9 @@ NativeWindow Desktop::CreateNativeWindow(std::u16string const& title, std::uint3
             Find(ownerOrParent)->children.push_back(record.handle);
         }
     } else {
-        record.owner = Find(ownerOrParent) ? ownerOrParent : 0;
+        // As on the platform, a window is owned by the top-level window of the one named, never by
+        // a child window (so only top-level windows ever own others).
+        record.owner = Find(ownerOrParent) ? TopLevelOf(ownerOrParent) : 0;
         zOrder_.push_back(record.handle);
     }
     NativeWindow handle = record.handle;
