@@ -3,7 +3,6 @@
 
 #include "frames/WorkspaceFrame.h"
 #include "host/ui/MonitorInfo.h"
-#include "layout/FrameDataProxy.h"
 #include "layout/Splitter.h"
 #include "workspace/TabPanel.h"
 #include "workspace/TopLevelWindow.h"
@@ -13,17 +12,6 @@
 #include <list>
 
 namespace orvworkspace::workspace {
-
-namespace {
-void PutOnSide(BuildContext const& context, LayoutManagerElement* element) {
-    element->SetParent(context.parent);
-    if (context.leftOrTop) {
-        context.parent->SetLeftOrTop(element);
-    } else {
-        context.parent->SetRightOrBottom(element);
-    }
-}
-} // namespace
 
 void FrameBuilder::AddTab(std::string const& tabType, bool remembered) {
     (remembered ? remembered_ : shown_).push_back(tabType);
@@ -37,59 +25,25 @@ void FrameBuilder::Build(Workspace& workspace, TopLevelWindow& window, BuildCont
             frame->AddTab(panel, false);
         }
     }
-    bool shown = frame->GetTabCount() > 0;
-    if (shown) {
-        frame->GetLMFrame()->SetLayoutManager(window.GetLayoutManager());
-        PutOnSide(context, frame->GetLMFrame());
-        context.frames->push_back(frame);
-    } else {
-        window.ChildRemove(frame.get());
-    }
-    boost::intrusive_ptr<WorkspaceFrame> hiddenFrame;
-    TabDataList removed;
+    TabDataList closed;
     for (std::string const& type : remembered_) {
-        if (!workspace.TabTypeHidesWhenClosed(type)) {
-            removed.emplace_back(type, "");
-            continue;
-        }
-        WorkspaceFrame* keeper = frame.get();
-        if (!shown) {
-            if (!hiddenFrame) {
-                hiddenFrame = window.CreateWorkspaceFrame();
-                window.ChildRemove(hiddenFrame.get());
-                hiddenFrame->ShowFrame(false);
-                window.AddHiddenFrame(hiddenFrame);
-            }
-            keeper = hiddenFrame.get();
-        }
-        if (boost::intrusive_ptr<TabPanel> panel =
-                TakeOrCreateTabPanel(workspace, type, *context.pool, nullptr)) {
-            panel->SetFrame(nullptr);
-            keeper->CacheTabData(panel, true);
-        }
+        closed.emplace_back(type, "");
     }
-    if (shown) {
-        for (auto const& entry : removed) {
-            frame->AddRemovedTabData(entry.first, entry.second);
-        }
-        long index = std::min<long>(long(front_), frame->GetTabCount() - 1);
-        frame->BringTabToFront(index);
-        frame->GetFrontTabPanel()->UI_Show(true);
+    if (frame->GetTabCount() == 0) {
+        window.ChildRemove(frame.get());
+        MakeFrameProxy(window, workspace, closed, *context.pool, context.parent, context.leftOrTop);
         return;
     }
-    FrameDataProxy* proxy = nullptr;
-    if (hiddenFrame) {
-        hiddenFrame->SetRemovedTabData(removed);
-        proxy = new FrameDataProxy(window.GetLayoutManager(), hiddenFrame->GetLMFrame());
-    } else {
-        proxy = new FrameDataProxy(window.GetLayoutManager(), removed);
+    frame->GetLMFrame()->SetLayoutManager(window.GetLayoutManager());
+    PutOnSide(context.parent, frame->GetLMFrame(), context.leftOrTop);
+    context.frames->push_back(frame);
+    TabDataList removed =
+        KeepClosedTabs(workspace, closed, *context.pool, [&]() -> WorkspaceFrame& { return *frame; });
+    if (!removed.empty()) {
+        frame->SetRemovedTabData(removed);
     }
-    PutOnSide(context, proxy);
-    if (context.leftOrTop) {
-        context.parent->SetLeftOrTopVisible(false);
-    } else {
-        context.parent->SetRightOrBottomVisible(false);
-    }
+    frame->BringTabToFront(std::min<long>(long(front_), frame->GetTabCount() - 1));
+    frame->GetFrontTabPanel()->UI_Show(true);
 }
 
 void SplitterBuilder::AddElement(std::unique_ptr<BuilderBase> builder, bool leftOrTop) {
@@ -98,10 +52,9 @@ void SplitterBuilder::AddElement(std::unique_ptr<BuilderBase> builder, bool left
 
 void SplitterBuilder::Build(Workspace& workspace, TopLevelWindow& window, BuildContext& context) {
     auto* splitter = new Splitter(context.parent->GetLayoutManager(), vertical_);
-    PutOnSide(context, splitter);
+    PutOnSide(context.parent, splitter, context.leftOrTop);
     for (bool leftOrTop : {true, false}) {
-        BuilderBase* child = (leftOrTop ? first_ : second_).get();
-        if (child) {
+        if (BuilderBase* child = (leftOrTop ? first_ : second_).get()) {
             BuildContext inner = context;
             inner.parent = splitter;
             inner.leftOrTop = leftOrTop;
@@ -133,22 +86,11 @@ void WorkspaceBuilder::BuildWorkspace() {
         if (!existing.empty()) {
             window = existing.front();
             existing.pop_front();
-            for (auto side :
-                 {LayoutManager::Top, LayoutManager::Left, LayoutManager::Right, LayoutManager::Bottom}) {
-                if (window->HasStaticElement(side)) {
-                    window->RemoveStaticElement(side, false);
-                }
-            }
+            RemoveStaticElements(*window);
         } else {
             window = workspace_.AddTopLevelWindow(workspace_.GetMainTopLevelWindow() == nullptr, nullptr);
         }
-        std::vector<boost::intrusive_ptr<WorkspaceFrame>> oldFrames;
-        for (std::size_t i = 0; i < window->ChildSize(); ++i) {
-            if (auto* frame = dynamic_cast<WorkspaceFrame*>(window->ChildGet(i))) {
-                oldFrames.emplace_back(frame);
-            }
-        }
-        (void)window->TakeHiddenFrames();
+        (void)window->TakeHiddenFrames(); // their panels are in the pool
         RectT rect = record.rect;
         if (orvui::utility::MonitorInfo* monitors = workspace_.ORV_GetMonitorInfo()) {
             monitors->EnsureRectIsVisible(rect);
@@ -161,12 +103,7 @@ void WorkspaceBuilder::BuildWorkspace() {
             record.root->Build(workspace_, *window, context);
         }
         window->UI_Show(true);
-        window->ResetRootFrame(root, frames);
-        for (auto const& old : oldFrames) {
-            if (std::find(frames.begin(), frames.end(), old) == frames.end()) {
-                window->ChildRemove(old.get());
-            }
-        }
+        InstallTree(*window, root, frames);
         if (!record.toolBarTabType.empty()) {
             window->SetStaticElement(record.toolBarTabType, LayoutManager::Top, false);
         }
@@ -182,14 +119,7 @@ void WorkspaceBuilder::BuildWorkspace() {
     }
     // Panels nobody asked for are released without being orphaned.
     for (auto const& panel : pool) {
-        if (auto* frame = dynamic_cast<WorkspaceFrame*>(panel->GetFrame())) {
-            for (long i = 0; i < frame->GetTabCount(); ++i) {
-                if (frame->GetTabPanel(i) == panel.get()) {
-                    frame->DetachTabPanel(i);
-                    break;
-                }
-            }
-        }
+        Unplace(*panel);
     }
 }
 

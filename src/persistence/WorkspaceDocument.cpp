@@ -18,6 +18,7 @@
 #include "workspace/Workspace.h"
 
 #include <algorithm>
+#include <functional>
 #include <set>
 
 namespace orvworkspace::workspace {
@@ -118,8 +119,6 @@ void SaveSplitter(Splitter const& splitter, PropList& list, bool framesAsProxies
 
 // --- Restoring ---
 
-namespace {
-// Takes a panel out of whatever held it before the restore: a frame's tabs or a tabless frame.
 void Unplace(TabPanel& panel) {
     if (auto* frame = dynamic_cast<WorkspaceFrame*>(panel.GetFrame())) {
         for (long i = 0; i < frame->GetTabCount(); ++i) {
@@ -132,8 +131,6 @@ void Unplace(TabPanel& panel) {
         tabless->DetachTabPanel(0);
     }
 }
-
-} // namespace
 
 boost::intrusive_ptr<TabPanel> TakeOrCreateTabPanel(Workspace& workspace, std::string const& type,
                                                     ReusableTabPool& pool, WorkspaceFrameBase* frame) {
@@ -171,15 +168,6 @@ struct Restorer {
     std::vector<boost::intrusive_ptr<WorkspaceFrame>>& frames;
 
     LayoutManager* Layout() const { return window.GetLayoutManager(); }
-
-    static void PutOnSide(Splitter* parent, LayoutManagerElement* child, bool leftOrTop) {
-        child->SetParent(parent);
-        if (leftOrTop) {
-            parent->SetLeftOrTop(child);
-        } else {
-            parent->SetRightOrBottom(child);
-        }
-    }
 
     void RestoreSplitter(Splitter* splitter, PropList const& list, int depth) {
         PropList const* in = list.GetSubList("Splitter");
@@ -224,7 +212,7 @@ struct Restorer {
                 proxyList->GetValue(Numbered("HidTabState-", k), state);
                 pairs.emplace_back(types[k], state);
             }
-            MakeFrameProxy(pairs, parent, leftOrTop);
+            MakeFrameProxy(window, workspace, pairs, pool, parent, leftOrTop);
         }
     }
 
@@ -260,24 +248,13 @@ struct Restorer {
         if (!kept) {
             window.ChildRemove(frame.get());
             if (!pairs.empty()) {
-                MakeFrameProxy(pairs, parent, leftOrTop);
+                MakeFrameProxy(window, workspace, pairs, pool, parent, leftOrTop);
             }
             return;
         }
         PutOnSide(parent, frame->GetLMFrame(), leftOrTop);
-        TabDataList removed;
-        for (auto const& pair : pairs) {
-            if (workspace.TabTypeHidesWhenClosed(pair.first)) {
-                if (boost::intrusive_ptr<TabPanel> panel =
-                        TakeOrCreateTabPanel(workspace, pair.first, pool, nullptr)) {
-                    panel->SetFrame(nullptr);
-                    LoadState(*panel, pair.second);
-                    frame->CacheTabData(panel, true);
-                }
-            } else {
-                removed.push_back(pair);
-            }
-        }
+        TabDataList removed =
+            KeepClosedTabs(workspace, pairs, pool, [&]() -> WorkspaceFrame& { return *frame; });
         if (!removed.empty()) {
             frame->SetRemovedTabData(removed);
         }
@@ -287,43 +264,11 @@ struct Restorer {
         frame->BringTabToFront(current);
         frames.push_back(frame);
     }
-
-    void MakeFrameProxy(TabDataList const& pairs, Splitter* parent, bool leftOrTop) {
-        boost::intrusive_ptr<WorkspaceFrame> hiddenFrame;
-        TabDataList removed;
-        for (auto const& pair : pairs) {
-            if (workspace.TabTypeHidesWhenClosed(pair.first)) {
-                if (!hiddenFrame) {
-                    hiddenFrame = window.CreateWorkspaceFrame();
-                    window.ChildRemove(hiddenFrame.get()); // kept out of the window until it comes back
-                }
-                if (boost::intrusive_ptr<TabPanel> panel =
-                        TakeOrCreateTabPanel(workspace, pair.first, pool, nullptr)) {
-                    panel->SetFrame(nullptr);
-                    LoadState(*panel, pair.second);
-                    hiddenFrame->CacheTabData(panel, true);
-                }
-            } else {
-                removed.push_back(pair);
-            }
-        }
-        FrameDataProxy* proxy = nullptr;
-        if (hiddenFrame) {
-            hiddenFrame->ShowFrame(false);
-            window.AddHiddenFrame(hiddenFrame);
-            hiddenFrame->SetRemovedTabData(removed);
-            proxy = new FrameDataProxy(Layout(), hiddenFrame->GetLMFrame());
-        } else {
-            proxy = new FrameDataProxy(Layout(), removed);
-        }
-        PutOnSide(parent, proxy, leftOrTop);
-        if (leftOrTop) {
-            parent->SetLeftOrTopVisible(false);
-        } else {
-            parent->SetRightOrBottomVisible(false);
-        }
-    }
 };
+
+} // namespace
+
+// --- Shared with the builders ---
 
 void RemoveStaticElements(TopLevelWindow& window) {
     for (StaticPlace const& place : StaticPlaces) {
@@ -333,7 +278,77 @@ void RemoveStaticElements(TopLevelWindow& window) {
     }
 }
 
-} // namespace
+void PutOnSide(Splitter* parent, LayoutManagerElement* child, bool leftOrTop) {
+    child->SetParent(parent);
+    if (leftOrTop) {
+        parent->SetLeftOrTop(child);
+    } else {
+        parent->SetRightOrBottom(child);
+    }
+}
+
+TabDataList KeepClosedTabs(Workspace& workspace, TabDataList const& pairs, ReusableTabPool& pool,
+                           std::function<WorkspaceFrame&()> const& keeper) {
+    TabDataList removed;
+    for (auto const& pair : pairs) {
+        if (!workspace.TabTypeHidesWhenClosed(pair.first)) {
+            removed.push_back(pair);
+            continue;
+        }
+        if (boost::intrusive_ptr<TabPanel> panel =
+                TakeOrCreateTabPanel(workspace, pair.first, pool, nullptr)) {
+            panel->SetFrame(nullptr);
+            LoadState(*panel, pair.second);
+            keeper().CacheTabData(panel, true);
+        }
+    }
+    return removed;
+}
+
+void MakeFrameProxy(TopLevelWindow& window, Workspace& workspace, TabDataList const& pairs,
+                    ReusableTabPool& pool, Splitter* parent, bool leftOrTop) {
+    boost::intrusive_ptr<WorkspaceFrame> hiddenFrame;
+    TabDataList removed = KeepClosedTabs(workspace, pairs, pool, [&]() -> WorkspaceFrame& {
+        if (!hiddenFrame) {
+            hiddenFrame = window.CreateWorkspaceFrame();
+            window.ChildRemove(hiddenFrame.get()); // kept out of the window until it comes back
+        }
+        return *hiddenFrame;
+    });
+    FrameDataProxy* proxy = nullptr;
+    if (hiddenFrame) {
+        hiddenFrame->ShowFrame(false);
+        window.AddHiddenFrame(hiddenFrame);
+        hiddenFrame->SetRemovedTabData(removed);
+        proxy = new FrameDataProxy(window.GetLayoutManager(), hiddenFrame->GetLMFrame());
+    } else {
+        proxy = new FrameDataProxy(window.GetLayoutManager(), removed);
+    }
+    PutOnSide(parent, proxy, leftOrTop);
+    if (leftOrTop) {
+        parent->SetLeftOrTopVisible(false);
+    } else {
+        parent->SetRightOrBottomVisible(false);
+    }
+}
+
+void InstallTree(TopLevelWindow& window, Splitter* root,
+                 std::vector<boost::intrusive_ptr<WorkspaceFrame>>& frames) {
+    window.ResetRootFrame(root, frames);
+    std::set<WorkspaceFrame*> built;
+    for (auto const& frame : frames) {
+        built.insert(frame.get());
+    }
+    std::vector<boost::intrusive_ptr<WorkspaceFrame>> stale;
+    for (std::size_t i = 0; i < window.ChildSize(); ++i) {
+        if (auto* frame = dynamic_cast<WorkspaceFrame*>(window.ChildGet(i)); frame && !built.count(frame)) {
+            stale.emplace_back(frame);
+        }
+    }
+    for (auto const& frame : stale) {
+        window.ChildRemove(frame.get());
+    }
+}
 
 // --- Paths ---
 
@@ -411,13 +426,7 @@ void RestoreTopLevelWindow(TopLevelWindow& window, PropList const& list, Reusabl
     sz.resize(4, 0);
     RectT saved(sz[0], sz[1], sz[2], sz[3]);
 
-    // The frames and hidden frames the window had go once the new tree is in place.
-    std::vector<boost::intrusive_ptr<WorkspaceFrame>> oldFrames;
-    for (std::size_t i = 0; i < window.ChildSize(); ++i) {
-        if (auto* frame = dynamic_cast<WorkspaceFrame*>(window.ChildGet(i))) {
-            oldFrames.emplace_back(frame);
-        }
-    }
+    // The hidden frames the window had go with the old tree; their panels are in the pool.
     auto oldHidden = window.TakeHiddenFrames();
 
     std::vector<boost::intrusive_ptr<WorkspaceFrame>> frames;
@@ -440,12 +449,7 @@ void RestoreTopLevelWindow(TopLevelWindow& window, PropList const& list, Reusabl
         }
     }
     window.UI_Show(true);
-    window.ResetRootFrame(root, frames);
-    for (auto const& old : oldFrames) {
-        if (std::find(frames.begin(), frames.end(), old) == frames.end()) {
-            window.ChildRemove(old.get());
-        }
-    }
+    InstallTree(window, root, frames);
     if (window.IsMain()) {
         for (StaticPlace const& place : StaticPlaces) {
             bool has = false;

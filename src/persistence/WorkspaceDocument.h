@@ -13,8 +13,10 @@
 #include "layout/LayoutTypes.h"
 
 #include <boost/intrusive_ptr.hpp>
+#include <functional>
 #include <list>
 #include <string>
+#include <vector>
 
 namespace orvcore::proplist {
 class PropList;
@@ -23,10 +25,12 @@ class PropList;
 namespace orvworkspace::workspace {
 
 class Frame;
+class LayoutManagerElement;
 class Splitter;
 class TabPanel;
 class TopLevelWindow;
 class Workspace;
+class WorkspaceFrame;
 class WorkspaceFrameBase;
 
 using ReusableTabPool = std::list<boost::intrusive_ptr<TabPanel>>;
@@ -54,6 +58,22 @@ boost::intrusive_ptr<TabPanel> TakeOrCreateTabPanel(Workspace& workspace, std::s
                                                     ReusableTabPool& pool, WorkspaceFrameBase* frame);
 // Every panel of the workspace now: in frames, static bars and hidden tabs, in window order.
 ReusableTabPool CollectReusableTabs(Workspace& workspace);
+
+// --- Shared by the document reader and the builders ---
+// Takes a panel out of whatever holds it (a frame's tabs or a tabless frame).
+void Unplace(TabPanel& panel);
+void RemoveStaticElements(TopLevelWindow& window);
+void PutOnSide(Splitter* parent, LayoutManagerElement* child, bool leftOrTop);
+// Closed tabs (type, state) of a frame: a type that hides when closed comes back as a kept panel
+// (from the pool or its creator) in the keeper frame; the others are returned, to be remembered.
+TabDataList KeepClosedTabs(Workspace& workspace, TabDataList const& pairs, ReusableTabPool& pool,
+                           std::function<WorkspaceFrame&()> const& keeper);
+// A placeholder on the parent's side, which is hidden, standing for a frame of closed tabs.
+void MakeFrameProxy(TopLevelWindow& window, Workspace& workspace, TabDataList const& pairs,
+                    ReusableTabPool& pool, Splitter* parent, bool leftOrTop);
+// Installs a built tree and removes the window's frames that are not part of it.
+void InstallTree(TopLevelWindow& window, Splitter* root,
+                 std::vector<boost::intrusive_ptr<WorkspaceFrame>>& frames);
 
 // "0" and "1" from the root splitter down to the frame (left or top, right or bottom).
 std::string GetMaximizedFramePath(Frame const* frame);

@@ -15,20 +15,6 @@ using orvui::ui::RectT;
 
 namespace {
 
-// A panel that asks the layout for given sizes.
-class SizedPanel : public PaintedPanel {
-public:
-    SizedPanel(Workspace* ws, std::vector<PointT> sizes)
-        : PaintedPanel(ws, nullptr, "sized", MixerPaint, nullptr)
-        , snapSizes(std::move(sizes)) {}
-    std::vector<PointT> snapSizes;
-
-private:
-    void DoGetSnapSizes(std::vector<PointT>& out) const override {
-        out.insert(out.end(), snapSizes.begin(), snapSizes.end());
-    }
-};
-
 // A tool bar 30 units high that may be torn off.
 class ToolBar : public SizedPanel, public WorkspaceBorderElement {
 public:

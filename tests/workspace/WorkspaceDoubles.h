@@ -53,6 +53,20 @@ private:
     std::vector<std::string>* log_;
 };
 
+// A painted panel that asks the layout for given snap sizes.
+class SizedPanel : public PaintedPanel {
+public:
+    SizedPanel(Workspace* ws, std::vector<orvui::ui::PointT> sizes)
+        : PaintedPanel(ws, nullptr, "sized", canvasor::ColorRGBA(0.5f, 0.5f, 0.5f, 1), nullptr)
+        , snapSizes_(std::move(sizes)) {}
+
+private:
+    void DoGetSnapSizes(std::vector<orvui::ui::PointT>& out) const override {
+        out.insert(out.end(), snapSizes_.begin(), snapSizes_.end());
+    }
+    std::vector<orvui::ui::PointT> snapSizes_;
+};
+
 struct PanelKind {
     std::string type;
     canvasor::ColorRGBA paint;

@@ -75,20 +75,6 @@ unsigned long Cmd(WorkspaceFrame::FlyoutCommand c) {
     return WorkspaceFrame::CommandNumber(c);
 }
 
-// A panel that asks the layout for given sizes.
-class SizedPanel : public PaintedPanel {
-public:
-    SizedPanel(Workspace* ws, std::vector<PointT> sizes)
-        : PaintedPanel(ws, nullptr, "sized", MixerPaint, nullptr)
-        , snapSizes_(std::move(sizes)) {}
-
-private:
-    void DoGetSnapSizes(std::vector<PointT>& out) const override {
-        out.insert(out.end(), snapSizes_.begin(), snapSizes_.end());
-    }
-    std::vector<PointT> snapSizes_;
-};
-
 // A panel with an item of its own in the flyout menu, which it counts when chosen.
 class PanelWithCommands : public PaintedPanel {
 public:
