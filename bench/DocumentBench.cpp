@@ -42,6 +42,18 @@ void BM_SaveAndRestore(benchmark::State& state) {
     documentBytes[n] = orvcore::proplist::utils::DocumentText(doc).size();
 }
 
+// Saving alone is one linear walk of the tree into a new document; how it grows from 256 to 1024
+// frames shows what the machine's caches add to any linear pass over a workspace that size.
+void BM_Save(benchmark::State& state) {
+    int n = int(state.range(0));
+    BenchWorkspace bench(n, {"first", "second"});
+    for (auto _ : state) {
+        PropList doc;
+        SaveWorkspace(*bench.workspace, doc, u"Bench");
+        benchmark::DoNotOptimize(doc);
+    }
+}
+
 void BM_SaveAndRestoreFile(benchmark::State& state) {
     int n = int(state.range(0));
     BenchWorkspace bench(n, {"first", "second"});
@@ -65,6 +77,8 @@ BENCHMARK(BM_SaveAndRestore)
     ->Repetitions(5)
     ->ReportAggregatesOnly(true)
     ->Unit(benchmark::kMicrosecond);
+BENCHMARK(BM_Save)->Arg(256)->Arg(1024)->Repetitions(5)->ReportAggregatesOnly(true)->Unit(
+    benchmark::kMicrosecond);
 BENCHMARK(BM_SaveAndRestoreFile)
     ->RangeMultiplier(4)
     ->Range(16, 1024)
@@ -90,6 +104,10 @@ int main(int argc, char** argv) {
     if (us("BM_SaveAndRestore", 256) > 0) {
         std::printf("document(1024) / document(256): %.2f (linear is 4)\n",
                     us("BM_SaveAndRestore", 1024) / us("BM_SaveAndRestore", 256));
+    }
+    if (us("BM_Save", 256) > 0) {
+        std::printf("save alone, a linear walk, for scale: %.0f us and %.0f us, ratio %.2f\n",
+                    us("BM_Save", 256), us("BM_Save", 1024), us("BM_Save", 1024) / us("BM_Save", 256));
     }
     benchmark::Shutdown();
     return 0;

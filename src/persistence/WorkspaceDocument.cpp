@@ -20,10 +20,12 @@
 #include <algorithm>
 #include <functional>
 #include <set>
+#include <unordered_set>
 
 namespace orvworkspace::workspace {
 
 using orvcore::proplist::PropList;
+using orvui::ui::UI_Node;
 using orvui::ui::UI_NodeManager;
 
 namespace {
@@ -335,19 +337,12 @@ void MakeFrameProxy(TopLevelWindow& window, Workspace& workspace, TabDataList co
 void InstallTree(TopLevelWindow& window, Splitter* root,
                  std::vector<boost::intrusive_ptr<WorkspaceFrame>>& frames) {
     window.ResetRootFrame(root, frames);
-    std::set<WorkspaceFrame*> built;
+    std::unordered_set<UI_Node const*> built;
     for (auto const& frame : frames) {
         built.insert(frame.get());
     }
-    std::vector<boost::intrusive_ptr<WorkspaceFrame>> stale;
-    for (std::size_t i = 0; i < window.ChildSize(); ++i) {
-        if (auto* frame = dynamic_cast<WorkspaceFrame*>(window.ChildGet(i)); frame && !built.count(frame)) {
-            stale.emplace_back(frame);
-        }
-    }
-    for (auto const& frame : stale) {
-        window.ChildRemove(frame.get());
-    }
+    window.ChildRemoveIf(
+        [&](UI_Node* child) { return dynamic_cast<WorkspaceFrame*>(child) && !built.count(child); });
 }
 
 // --- Paths ---

@@ -224,6 +224,21 @@ TEST_F(NodeTest, ChildrenCanBeReorderedAndFound) {
     second->UI_SetParent(nullptr);
     EXPECT_EQ(outer->ChildSize(), 1u);
     EXPECT_FALSE(window->ChildRemove(second.get()));
+    // Removing many at once keeps the order of the rest and leaves the removed ones parentless.
+    std::vector<boost::intrusive_ptr<RecordingNode>> many;
+    for (char const* name : {"a", "b", "c", "d"}) {
+        many.emplace_back(new RecordingNode(name, &log));
+        window->ChildPushBack(many.back());
+    }
+    std::size_t before = window->ChildSize();
+    EXPECT_EQ(window->ChildRemoveIf([&](UI_Node* n) { return n == many[0].get() || n == many[2].get(); }),
+              2u);
+    EXPECT_EQ(window->ChildSize(), before - 2);
+    EXPECT_EQ(window->ChildIndex(many[3].get()), window->ChildIndex(many[1].get()) + 1);
+    EXPECT_EQ(many[0]->UI_GetParentNode(), nullptr);
+    EXPECT_EQ(many[2]->UI_GetParentNode(), nullptr);
+    EXPECT_EQ(many[1]->UI_GetParentNode(), window.get());
+    EXPECT_EQ(window->ChildRemoveIf([](UI_Node*) { return false; }), 0u);
 }
 
 TEST_F(NodeTest, TabMovesFocusThroughTheWindowAndShiftTabBack) {

@@ -29,6 +29,7 @@
 #include <memory>
 #include <mutex>
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 namespace orvui::ui {
@@ -243,7 +244,7 @@ private:
     bool RunNextDue(double until, unsigned long newestCall);
 
     std::vector<RectT> monitors_;
-    std::map<NativeWindow, NativeWindowRecord> records_;
+    std::unordered_map<NativeWindow, NativeWindowRecord> records_;
     std::vector<NativeWindow> zOrder_; // top-level windows, bottom to top
     static inline NativeWindow nextHandle_ = 0x100;
     NativeWindow active_ = 0;

@@ -93,6 +93,26 @@ bool UI_Node::ChildRemove(UI_Node* child) {
     return true;
 }
 
+std::size_t UI_Node::ChildRemoveIf(std::function<bool(UI_Node*)> const& pick) {
+    std::vector<boost::intrusive_ptr<UI_Node>> kept, removed;
+    kept.reserve(children_.size());
+    for (auto& child : children_) {
+        (pick(child.get()) ? removed : kept).push_back(std::move(child));
+    }
+    if (removed.empty()) {
+        children_ = std::move(kept);
+        return 0;
+    }
+    children_ = std::move(kept);
+    for (auto const& child : removed) {
+        child->parent_ = nullptr;
+        child->UI_ParentChanged();
+        ChildRemoved(child.get());
+    }
+    UI_Invalidate();
+    return removed.size();
+}
+
 void UI_Node::ChildMove(UI_Node* child, std::size_t index) {
     std::size_t from = ChildIndex(child);
     if (from == children_.size()) {

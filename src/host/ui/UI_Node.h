@@ -10,6 +10,7 @@
 
 #include <atomic>
 #include <boost/intrusive_ptr.hpp>
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -49,6 +50,9 @@ public:
     void ChildInsert(std::size_t index, boost::intrusive_ptr<UI_Node> child);
     // Takes the child out; false when it is none of ours.
     bool ChildRemove(UI_Node* child);
+    // Takes out every child the predicate picks in one pass (removing many children one by one
+    // would shift the rest each time); returns how many went.
+    std::size_t ChildRemoveIf(std::function<bool(UI_Node*)> const& pick);
     // Moves a child to another position among its siblings.
     void ChildMove(UI_Node* child, std::size_t index);
     UI_Node* ChildGet(std::size_t index) const {
