@@ -322,7 +322,9 @@ void MakeFrameProxy(TopLevelWindow& window, Workspace& workspace, TabDataList co
         hiddenFrame->ShowFrame(false);
         window.AddHiddenFrame(hiddenFrame);
         hiddenFrame->SetRemovedTabData(removed);
-        proxy = new FrameDataProxy(window.GetLayoutManager(), hiddenFrame->GetLMFrame());
+        // The placeholder carries the remembered tabs as well, as one left by removing a frame
+        // does; it alone is what the next save writes.
+        proxy = new FrameDataProxy(window.GetLayoutManager(), hiddenFrame->GetLMFrame(), removed);
     } else {
         proxy = new FrameDataProxy(window.GetLayoutManager(), removed);
     }
@@ -450,7 +452,10 @@ void RestoreTopLevelWindow(TopLevelWindow& window, PropList const& list, Reusabl
             bool has = false;
             std::string type;
             if (list.GetValue(place.flagKey, has) && has && list.GetValue(place.typeKey, type)) {
-                window.SetStaticElement(type, place.side, false);
+                // A bar's panel comes through the pool like any tab, so it keeps its identity.
+                if (auto panel = TakeOrCreateTabPanel(*workspace, type, pool, nullptr)) {
+                    window.SetStaticElement(panel, place.side, false);
+                }
             }
         }
     }
