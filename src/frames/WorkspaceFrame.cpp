@@ -7,12 +7,14 @@
 #include "host/core/Localizer.h"
 #include "host/core/PropList.h"
 #include "host/core/PropListUtils.h"
+#include "host/ui/Desktop.h"
 #include "host/ui/Menu.h"
 #include "host/ui/NodeManager.h"
 #include "layout/Splitter.h"
 #include "workspace/TabCreator.h"
 #include "workspace/TabPanel.h"
 #include "workspace/TopLevelWindow.h"
+#include "workspace/Tracker.h"
 #include "workspace/Workspace.h"
 #include "workspace/WorkspaceUtils.h"
 
@@ -359,19 +361,55 @@ bool WorkspaceFrame::GetTabRect(long index, RectT& out) const {
 }
 
 bool WorkspaceFrame::GetTabIndexFromPos(PointT const& global, long& index) const {
+    return GetTabInsertIndexFromPos(global, index, nullptr);
+}
+
+std::vector<RectT> WorkspaceFrame::GetTabRects() const {
+    std::vector<RectT> rects;
+    for (long i = 0; i < GetTabCount(); ++i) {
+        RectT r;
+        GetTabRect(i, r);
+        rects.push_back(r);
+    }
+    return rects;
+}
+
+bool WorkspaceFrame::GetTabInsertIndexFromPos(PointT const& global, long& index,
+                                              std::vector<RectT> const* tabRects) const {
     RectT well = GetTabWellGlobalRect();
     if (well.IsEmpty() || !well.Contains(global)) {
         return false;
     }
+    std::vector<RectT> computed;
+    if (!tabRects) {
+        computed = GetTabRects();
+        tabRects = &computed;
+    }
     PointT local = UI_GlobalToLocal(global);
-    for (long i = 0; i < GetTabCount(); ++i) {
-        RectT r;
-        if (GetTabRect(i, r) && !r.IsEmpty() && r.Contains(local)) {
-            index = i;
+    for (std::size_t i = 0; i < tabRects->size(); ++i) {
+        RectT const& r = (*tabRects)[i];
+        if (!r.IsEmpty() && r.Contains(local)) {
+            index = long(i);
             return true;
         }
     }
     return false;
+}
+
+void WorkspaceFrame::OfferTabDrag(bool wholeFrame, long index) {
+    Workspace* workspace = GetWorkspace();
+    if (!workspace || index < 0) {
+        return;
+    }
+    Tracker* tracker = workspace->AcquireTabDragger(this, wholeFrame, static_cast<unsigned long>(index));
+    if (!tracker) {
+        return;
+    }
+    bool endAtOnce = false;
+    tracker->Begin(orvui::ui::Desktop::Get().GetMousePosition(), &endAtOnce);
+    if (endAtOnce) {
+        workspace->ReleaseTracker(false);
+    }
 }
 
 void WorkspaceFrame::TabPanelNameChanged(TabPanel const& panel) {
@@ -535,6 +573,13 @@ void WorkspaceFrame::HandleTabItemAction(int action, long index, RectT const* re
     TabPanel* panel = GetTabPanel(index);
     switch (action) {
     case orvui::controls::TabPressed:
+        BringTabToFront(index);
+        FocusFrontPanel();
+        OfferTabDrag(false, index);
+        break;
+    case orvui::controls::FlyoutGripperPressed:
+        OfferTabDrag(true, GetFrontTabIndex());
+        break;
     case orvui::controls::TabKeyboardActivated:
     case orvui::controls::TabDoubleClicked:
         BringTabToFront(index);
@@ -865,11 +910,26 @@ bool WorkspaceFrame::UI_DoMouseEvent(UI_Node* target, MouseEvent& event) {
     if (target != this || !GetWorkspace()) {
         return false;
     }
+    Workspace* workspace = GetWorkspace();
     // Anything but a move over the frame's own edges ends a drag left running.
-    if (!event.IsAction(action::Move) && GetWorkspace()->GetTracker()) {
-        GetWorkspace()->ReleaseTracker(false);
+    if (!event.IsAction(action::Move) && workspace->GetTracker()) {
+        workspace->ReleaseTracker(false);
     }
-    return GetWorkspace()->GetTracker() != nullptr;
+    // A press on an edge that faces a splitter bar drags the bar.
+    if (event.IsAction(action::Press) && event.GetButton() == 0 && GetTopLevelWindow()) {
+        PointF local = event.GetLocalPoint();
+        PointT global =
+            UI_LocalToGlobal(PointT(std::int32_t(std::lround(local.x)), std::int32_t(std::lround(local.y))));
+        TopLevelWindow* window = GetTopLevelWindow();
+        if (Tracker* tracker = workspace->AcquireSplitterDragger(window, window->UI_GlobalToLocal(global))) {
+            bool endAtOnce = false;
+            tracker->Begin(global, &endAtOnce);
+            if (endAtOnce) {
+                workspace->ReleaseTracker(false);
+            }
+        }
+    }
+    return workspace->GetTracker() != nullptr;
 }
 
 } // namespace orvworkspace::workspace

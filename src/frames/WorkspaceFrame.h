@@ -59,12 +59,19 @@ public:
     void AddTabs(WorkspaceFrame* other);
     void AddTabs(std::vector<boost::intrusive_ptr<TabPanel>> const& panels);
     void AddTabs(std::vector<std::string> const& tabTypes);
+    // The tab index of a panel, or -1.
+    long IndexOf(TabPanel const* panel) const;
     void BringTabToFront(long index);
     void BringTabToFront(TabPanel* panel);
     void MoveTabPanel(long from, long to);
     // A tab's item rectangle in frame coordinates, rounded down.
     bool GetTabRect(long index, RectT& out) const;
     bool GetTabIndexFromPos(PointT const& global, long& index) const;
+    // Every tab's rectangle (frame coordinates), in tab order.
+    std::vector<RectT> GetTabRects() const;
+    // The tab under a global point among the given rectangles (the current ones when none).
+    bool GetTabInsertIndexFromPos(PointT const& global, long& index,
+                                  std::vector<RectT> const* tabRects) const;
     orvui::controls::UI_TabWell* GetTabWell() const;
     TabPanelContainer* GetContainer() const;
 
@@ -138,9 +145,11 @@ public:
     bool UI_DoMouseEvent(orvui::ui::UI_Node* target, orvui::ui::MouseEvent& event) override;
 
 private:
+    // Starts a drag of a tab (or of the whole frame) at the pointer.
+    void OfferTabDrag(bool wholeFrame, long index);
+
     void UpdateForTabContainerChanges();
     void FocusFrontPanel();
-    long IndexOf(TabPanel const* panel) const;
 
     RectT cachedTabPanelRect_{-1, -1, -1, -1};
     TabDataList removedTabData_;

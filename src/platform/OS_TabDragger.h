@@ -27,7 +27,8 @@ public:
     void DetachFrameWindow(OS_TopLevelWindow* window, orvui::ui::OS_Window* node);
     void DetachTopLevelWindow(OS_TopLevelWindow* window);
     void KeepNativeWindow(orvui::ui::NativeWindow handle);
-    virtual void DropTargetChanged() {}
+    // A platform hook when the drop target changes (0 a zone, 1 docked, 2 torn off); nothing here.
+    virtual void DropTargetChanged(int) {}
     std::vector<orvui::ui::NativeWindow> const& KeptWindows() const { return kept_; }
 
 private:

@@ -186,7 +186,7 @@ void OS_TopLevelWindow::UI_HandleOSEvent(OS_Event& event) {
         if (tracker) {
             PointT global = Desktop::Get().ClientToGlobal(
                 GetPlatformWindow(), PointT(PointParamX(event.lParam), PointParamY(event.lParam)));
-            tracker->Track(global);
+            tracker->Track(global, nullptr);
             if (tracker->HasBeenCancelled()) {
                 workspace_->ReleaseTracker(false);
             }

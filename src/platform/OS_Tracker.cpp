@@ -5,14 +5,16 @@
 
 namespace orvworkspace::workspace {
 
-void OS_Tracker::Begin(orvui::ui::PointT const&, bool& cancelled) {
-    cancelled = false;
+void OS_Tracker::Begin(orvui::ui::PointT const&, bool* endAtOnce) {
+    if (endAtOnce) {
+        *endAtOnce = false;
+    }
     if (trackedWindow_) {
         orvui::ui::Desktop::Get().SetCapture(trackedWindow_);
     }
 }
 
-void OS_Tracker::End(bool) {
+void OS_Tracker::End() {
     orvui::ui::Desktop& desktop = orvui::ui::Desktop::Get();
     if (trackedWindow_ && desktop.GetCapture() == trackedWindow_) {
         desktop.ReleaseCapture();

@@ -9,19 +9,21 @@ namespace orvworkspace::workspace {
 
 class OS_Tracker {
 public:
+    OS_Tracker() = default;
+    OS_Tracker(OS_Tracker const&) = delete;
+    OS_Tracker& operator=(OS_Tracker const&) = delete;
     virtual ~OS_Tracker() = default;
     virtual bool WantsKeyEvents() const = 0;
     virtual bool WantsIdleEvents() const = 0;
-    // Starts tracking: the window takes the mouse capture; cancelled is set to false.
-    virtual void Begin(orvui::ui::PointT const& global, bool& cancelled);
-    // One step of tracking at a global point.
-    virtual void Track(orvui::ui::PointT const& global) = 0;
-    // Ends tracking: the capture is released when the window still holds it.
-    virtual void End(bool cancel);
-    virtual void DoIdleEvent() {}
-    // A key while tracking (Escape cancels in the workspace's trackers).
-    virtual void DoKeyEvent(orvui::ui::KeyboardEvent&) {}
-    // Abandons the drag with a beep.
+    // Starts tracking: the tracked window takes the mouse capture; endAtOnce comes back false.
+    virtual void Begin(orvui::ui::PointT const& global, bool* endAtOnce);
+    // One step of tracking at a global point; keyEvent is the key that asked for it, if any.
+    virtual void Track(orvui::ui::PointT const& global, orvui::ui::KeyboardEvent const* keyEvent) = 0;
+    // Ends tracking: the capture is released when the tracked window still holds it.
+    virtual void End();
+    virtual void DoIdleEvent(orvui::ui::OS_Event const&) {}
+    virtual void DoKeyEvent(orvui::ui::KeyboardEvent const&) {}
+    // Abandons the drag with the warning beep.
     virtual void Cancel();
     virtual bool HasBeenCancelled() const = 0;
 

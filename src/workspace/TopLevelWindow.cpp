@@ -12,6 +12,7 @@
 #include "host/ui/controls/TabWell.h"
 #include "layout/FrameDataProxy.h"
 #include "workspace/TabCreator.h"
+#include "workspace/TabDragger.h"
 #include "workspace/TabPanel.h"
 #include "workspace/Workspace.h"
 
@@ -144,8 +145,18 @@ boost::intrusive_ptr<WorkspaceFrame> TopLevelWindow::CreateWorkspaceFrame(std::s
     return frame;
 }
 
+void TopLevelWindow::AdoptFrame(WorkspaceFrame* frame) {
+    frame->SetTopLevelWindow(this);
+    frame->GetLMFrame()->SetLayoutManager(layoutManager_.get());
+    if (frame->UI_GetParentNode() != this) {
+        ChildPushBack(frame);
+    }
+    frame->ShowFrame(true);
+}
+
 void TopLevelWindow::SetRootFrame(boost::intrusive_ptr<WorkspaceFrame> frame, bool) {
     if (frame) {
+        AdoptFrame(frame.get());
         layoutManager_->SetRootFrame(frame->GetLMFrame(), ClientLocalRect());
     }
 }
@@ -216,10 +227,7 @@ void TopLevelWindow::AddTabbedFrame(WorkspaceFrameBase* beside, boost::intrusive
     if (!frame) {
         return;
     }
-    if (frame->UI_GetParentNode() != this) {
-        ChildPushBack(frame);
-    }
-    frame->GetLMFrame()->SetLayoutManager(layoutManager_.get());
+    AdoptFrame(frame.get());
     layoutManager_->AddFrame(beside ? beside->GetLMFrame() : nullptr, side, frame->GetLMFrame());
 }
 
@@ -548,6 +556,106 @@ void TopLevelWindow::SetToGlobalTabSize(RectT const& rect) {
     UI_SetGlobalStructureRect(next);
 }
 
+// --- Drop-zone overlays ---
+
+DropZoneOverlayWindow* TopLevelWindow::CreateDropZoneOverlay(TabDragger* dragger, PointT const& point,
+                                                             WorkspaceFrame* frame) {
+    // Edges are offered unless docking at them would come from this very window and empty it.
+    bool edges = true;
+    if (WorkspaceFrame* source = dragger ? dragger->GetSourceFrame() : nullptr;
+        source && source->GetTopLevelWindow() == this) {
+        edges = GetFrameCount() >= 2 || (!dragger->IsWholeFrame() && source->GetTabCount() >= 2);
+    }
+    boost::intrusive_ptr<DropZoneOverlayWindow> made;
+    if (edges) {
+        made = CreateEdgeDropZoneOverlay(dragger, point);
+    }
+    if (!made && frame) {
+        made = CreateFrameDropZoneOverlay(dragger, point, frame);
+    }
+    if (!made) {
+        DestroyDropZoneOverlay();
+        return nullptr;
+    }
+    DestroyDropZoneOverlay();
+    dropZoneOverlay_ = made;
+    return made.get();
+}
+
+DropZoneOverlayWindow* TopLevelWindow::CreateEdgeDropZoneOverlay(TabDragger* dragger, PointT const& point) {
+    RectT rect;
+    std::vector<PointT> polygon;
+    DropZone::DropType type = GetEdgeDropZone(point, rect, polygon);
+    if (type == DropZone::None || rect.width <= 0 || rect.height <= 0) {
+        return nullptr;
+    }
+    return new EdgeDropZoneOverlayWindow(this, dragger, point, rect, polygon, type, false);
+}
+
+DropZoneOverlayWindow* TopLevelWindow::CreateFrameDropZoneOverlay(TabDragger* dragger, PointT const& point,
+                                                                  WorkspaceFrame* frame) {
+    if (!frame || !frame->GetFrontTabPanel()) {
+        return nullptr;
+    }
+    RectT rect = frame->UI_LocalToGlobal(frame->GetFrameRect());
+    std::vector<long> exclusions;
+    CalculateDropZoneExclusionsForEdges(rect, exclusions);
+    RectT visible(rect.left + std::int32_t(exclusions[1]), rect.top + std::int32_t(exclusions[0]),
+                  rect.width - std::int32_t(exclusions[1] + exclusions[3]),
+                  rect.height - std::int32_t(exclusions[0] + exclusions[2]));
+    if (visible.width <= 0 || visible.height <= 0) {
+        return nullptr; // a frame hidden entirely under the edge zones offers nothing of its own
+    }
+    return new FrameDropZoneOverlayWindow(dragger, point, rect, exclusions, frame, false);
+}
+
+void TopLevelWindow::DestroyDropZoneOverlay() {
+    if (boost::intrusive_ptr<DropZoneOverlayWindow> overlay = std::move(dropZoneOverlay_)) {
+        overlay->UI_SetOpacity(0);
+        overlay->DetachFromParent();
+    }
+}
+
+EdgeDropZoneOverlayWindow* TopLevelWindow::GetEdgeDropZoneOverlay() const {
+    return dynamic_cast<EdgeDropZoneOverlayWindow*>(dropZoneOverlay_.get());
+}
+
+FrameDropZoneOverlayWindow* TopLevelWindow::GetFrameDropZoneOverlay() const {
+    return dynamic_cast<FrameDropZoneOverlayWindow*>(dropZoneOverlay_.get());
+}
+
+// --- Drag position ---
+
+void TopLevelWindow::SetDragPosition(PointT const& point, bool wholeFrame) {
+    WorkspaceFrame* root = GetRootFrame();
+    if (!root) {
+        return;
+    }
+    RectT grip;
+    if (wholeFrame) {
+        if (auto* flyout = root->GetTabWell()->GetFlyout()) {
+            grip = flyout->GetGlobalGripperRect();
+        }
+    } else if (auto* item = root->GetTabWell()->GetTab(root->GetFrontTabIndex())) {
+        grip = item->GetGlobalGripperRect();
+    }
+    RectT outer = UI_GetGlobalStructureRect();
+    PointT gripCentre(grip.left + grip.width / 2, grip.top + grip.height / 2);
+    if (grip.width <= 0 || grip.height <= 0) {
+        gripCentre = PointT(outer.left + outer.width / 2, outer.top + 11); // the title bar's middle
+    }
+    PointT topLeft(outer.left + (point.x - gripCentre.x), outer.top + (point.y - gripCentre.y));
+    RectT monitor;
+    orvui::utility::MonitorInfo* monitors = workspace_ ? workspace_->ORV_GetMonitorInfo() : nullptr;
+    if (monitors && monitors->GetMonitorRectFromPoint(point, monitor)) {
+        topLeft.x = std::clamp(topLeft.x, monitor.left,
+                               std::max(monitor.left, monitor.left + monitor.width - outer.width));
+        topLeft.y = std::clamp(topLeft.y, monitor.top,
+                               std::max(monitor.top, monitor.top + monitor.height - outer.height));
+    }
+    UI_Move(topLeft);
+}
+
 void TopLevelWindow::ResetRootFrame(Splitter* splitter,
                                     std::vector<boost::intrusive_ptr<WorkspaceFrame>>& frames) {
     layoutManager_->SetMaximizedFrame(nullptr);
@@ -764,12 +872,9 @@ bool TopLevelWindow::UI_DoCursor(PointF local) {
     default:
         return false;
     }
-    try {
-        if (workspace_) {
-            workspace_->GetResourceManager()->SetCursor(cursorNumber);
-        }
-    } catch (orvcore::config::Error const&) {
-        // A host without resources still gets the splitter cursors.
+    if (workspace_) {
+        workspace_->SetToolkitCursor(cursorNumber);
+    } else {
         Desktop::Get().SetCursor(cursorNumber);
     }
     return true;

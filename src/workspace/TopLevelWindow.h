@@ -9,6 +9,7 @@
 #include "layout/DropZone.h"
 #include "layout/LayoutManager.h"
 #include "platform/OS_TopLevelWindow.h"
+#include "workspace/DropZoneOverlay.h"
 
 #include <list>
 #include <memory>
@@ -133,6 +134,23 @@ public:
                                        std::vector<PointT>& outPolygon) const;
     void CalculateDropZoneExclusionsForEdges(RectT const& area, std::vector<long>& exclusions) const;
 
+    // --- Drop-zone overlays (while a tab is dragged) ---
+    // An edge overlay when the point is on an allowed edge, else a frame overlay for frame; stored as
+    // this window's overlay (the previous one destroyed). Null, and no overlay, when neither applies.
+    DropZoneOverlayWindow* CreateDropZoneOverlay(TabDragger* dragger, PointT const& point,
+                                                 WorkspaceFrame* frame);
+    DropZoneOverlayWindow* CreateEdgeDropZoneOverlay(TabDragger* dragger, PointT const& point);
+    DropZoneOverlayWindow* CreateFrameDropZoneOverlay(TabDragger* dragger, PointT const& point,
+                                                      WorkspaceFrame* frame);
+    void DestroyDropZoneOverlay();
+    DropZoneOverlayWindow* GetDropZoneOverlay() const { return dropZoneOverlay_.get(); }
+    EdgeDropZoneOverlayWindow* GetEdgeDropZoneOverlay() const;
+    FrameDropZoneOverlayWindow* GetFrameDropZoneOverlay() const;
+
+    // Moves an interim window so that the grip of what it carries (the front tab's gripper, or the
+    // flyout gripper for a whole frame) is centred under the pointer, kept on the pointer's monitor.
+    void SetDragPosition(PointT const& point, bool wholeFrame);
+
     // The outer rectangle so that the root frame's front panel covers a screen rectangle.
     void SetToGlobalTabSize(RectT const& rect);
     // A built tree swapped in with the frames it holds.
@@ -156,11 +174,14 @@ protected:
     bool HasSingleWorkspaceFrame() const { return GetFrameCount() == 1; }
 
 private:
+    // Makes a frame from elsewhere (another window, or none) one of this window's.
+    void AdoptFrame(WorkspaceFrame* frame);
     RectT ClientRectInScreen() const;
     RectT ClientLocalRect() const;
     RectT AreaWithoutStaticFrames() const;
 
     bool interim_;
+    boost::intrusive_ptr<DropZoneOverlayWindow> dropZoneOverlay_;
     bool main_;
     bool acceptsTabs_ = true;
     std::unique_ptr<LayoutManager> layoutManager_;

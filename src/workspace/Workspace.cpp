@@ -6,6 +6,7 @@
 #include "host/core/ErrorTable.h"
 #include "host/core/PropList.h"
 #include "host/core/PropListUtils.h"
+#include "host/ui/Desktop.h"
 #include "host/ui/MonitorInfo.h"
 #include "host/ui/NodeManager.h"
 #include "host/ui/ResourceManager.h"
@@ -14,8 +15,10 @@
 #include "layout/Splitter.h"
 #include "persistence/WorkspaceDocument.h"
 #include "workspace/TabCreator.h"
+#include "workspace/TabDragger.h"
 #include "workspace/TabPanel.h"
 #include "workspace/TopLevelWindow.h"
+#include "workspace/Tracker.h"
 
 #include <algorithm>
 
@@ -120,9 +123,81 @@ bool Workspace::ChildRequestRemove(boost::intrusive_ptr<UI_Node> node) {
 }
 
 void Workspace::ReleaseTracker(bool cancel) {
+    // Taken out first: ending may bring the workspace back here (a release inside a release).
     std::unique_ptr<OS_Tracker> ending = std::move(tracker_);
-    if (ending) {
-        ending->End(cancel);
+    if (ending && cancel) {
+        ending->Cancel();
+    }
+    ending.reset();
+}
+
+Tracker* Workspace::AcquireSplitterDragger(TopLevelWindow* window, PointT const& point) {
+    if (!window) {
+        return nullptr;
+    }
+    auto dragger = std::make_unique<SplitterDragger>(this, window, point);
+    if (!dragger->HasLayoutTracker()) {
+        return nullptr;
+    }
+    SplitterDragger* raw = dragger.get();
+    tracker_.reset(); // the previous drag ends before the next one starts
+    tracker_ = std::move(dragger);
+    return raw;
+}
+
+Tracker* Workspace::AcquireTabDragger(WorkspaceFrame* sourceFrame, bool wholeFrame, unsigned long tabIndex) {
+    if (!sourceFrame || !sourceFrame->GetTopLevelWindow() || long(tabIndex) >= sourceFrame->GetTabCount()) {
+        return nullptr;
+    }
+    tracker_.reset();
+    auto dragger = std::make_unique<TabDragger>(this, sourceFrame, wholeFrame, tabIndex);
+    TabDragger* raw = dragger.get();
+    tracker_ = std::move(dragger);
+    return raw;
+}
+
+boost::intrusive_ptr<TopLevelWindow>
+Workspace::CreateDragSrcWindow(RectT const& rect, PointT const& point,
+                               boost::intrusive_ptr<WorkspaceFrame> frame) {
+    if (!frame) {
+        return nullptr;
+    }
+    boost::intrusive_ptr<TopLevelWindow> window = AddTopLevelWindow(true, nullptr);
+    window->SetRootFrame(frame, true);
+    return ShowDragSrcWindow(window, rect, point, true);
+}
+
+boost::intrusive_ptr<TopLevelWindow>
+Workspace::CreateDragSrcWindow(RectT const& rect, PointT const& point,
+                               std::vector<boost::intrusive_ptr<TabPanel>>& panels) {
+    if (panels.empty()) {
+        return nullptr;
+    }
+    boost::intrusive_ptr<TopLevelWindow> window = AddTopLevelWindow(true, nullptr);
+    window->CreateRootFrame(panels, true);
+    return ShowDragSrcWindow(window, rect, point, false);
+}
+
+boost::intrusive_ptr<TopLevelWindow> Workspace::ShowDragSrcWindow(boost::intrusive_ptr<TopLevelWindow> window,
+                                                                  RectT const& rect, PointT const& point,
+                                                                  bool wholeFrame) {
+    window->SetToGlobalTabSize(rect);
+    window->SetDragPosition(point, wholeFrame);
+    window->UI_Show(true);
+    window->UI_DispatchNodeChange(5);
+    if (WorkspaceFrame* root = window->GetRootFrame()) {
+        root->UI_UpdateNow(~0u);
+    }
+    // Translucent, the window lets the pointer reach the windows beneath it while it follows.
+    window->UI_SetOpacity(0.8f);
+    return window;
+}
+
+void Workspace::SetToolkitCursor(int cursor) const {
+    try {
+        GetResourceManager()->SetCursor(cursor);
+    } catch (orvcore::config::Error const&) {
+        orvui::ui::Desktop::Get().SetCursor(cursor);
     }
 }
 

@@ -34,6 +34,7 @@ namespace orvworkspace::workspace {
 
 class TabCreator;
 class TabPanel;
+class Tracker;
 class TopLevelWindow;
 class WorkspaceFrame;
 
@@ -76,9 +77,25 @@ public:
     std::vector<TopLevelWindow*> GetWindows() const;
 
     // --- Tracker ---
+    // The one tracker a drag holds; acquiring another destroys (and so ends) the previous one.
     OS_Tracker* GetTracker() const override { return tracker_.get(); }
     void SetTracker(std::unique_ptr<OS_Tracker> tracker) { tracker_ = std::move(tracker); }
+    // Cancels the tracker first when asked, then destroys it, which ends it.
     void ReleaseTracker(bool cancel) override;
+    // A splitter drag at a point in the window's local coordinates; null (and no tracker) when no
+    // splitter bar is there.
+    virtual Tracker* AcquireSplitterDragger(TopLevelWindow* window, PointT const& point);
+    // A drag of a frame's tab (or of the whole frame); null when the frame has no such tab.
+    virtual Tracker* AcquireTabDragger(WorkspaceFrame* sourceFrame, bool wholeFrame, unsigned long tabIndex);
+    // Floating interim windows that carry dragged content with the pointer.
+    virtual boost::intrusive_ptr<TopLevelWindow>
+    CreateDragSrcWindow(RectT const& rect, PointT const& point, boost::intrusive_ptr<WorkspaceFrame> frame);
+    virtual boost::intrusive_ptr<TopLevelWindow>
+    CreateDragSrcWindow(RectT const& rect, PointT const& point,
+                        std::vector<boost::intrusive_ptr<TabPanel>>& panels);
+    // Sets the toolkit cursor through the resources, or straight on the desktop when a host runs
+    // without resources (moving the mouse must never raise).
+    void SetToolkitCursor(int cursor) const;
 
     // --- Host commands and hooks ---
     virtual void DoWorkspaceCmdNew() {}
@@ -177,6 +194,9 @@ protected:
 private:
     struct LayoutDisabled;
     // Runs the action on every window with layout off, forgets closed windows, then lays out again.
+    boost::intrusive_ptr<TopLevelWindow> ShowDragSrcWindow(boost::intrusive_ptr<TopLevelWindow> window,
+                                                           RectT const& rect, PointT const& point,
+                                                           bool wholeFrame);
     void ForEachWindowWithLayoutOff(std::function<void(TopLevelWindow&)> const& action);
 
     std::unique_ptr<OS_Tracker> tracker_;

@@ -21,15 +21,21 @@ public:
         : log_(log) {}
     bool WantsKeyEvents() const override { return false; }
     bool WantsIdleEvents() const override { return false; }
-    void Track(PointT const& p) override {
+    void Track(PointT const& p, orvui::ui::KeyboardEvent const*) override {
         log_->push_back("track " + std::to_string(p.x) + "," + std::to_string(p.y));
         if (cancelAfterMoves > 0 && --cancelAfterMoves == 0) {
             cancelled = true;
         }
     }
-    void End(bool cancel) override {
-        log_->push_back(cancel ? "end cancelled" : "end");
-        OS_Tracker::End(cancel);
+    void Cancel() override {
+        log_->push_back("cancel");
+        cancelled = true;
+        OS_Tracker::Cancel();
+    }
+    // Ending comes with destruction, as for the workspace's own trackers.
+    ~RecordingTracker() override {
+        log_->push_back("end");
+        OS_Tracker::End();
     }
     bool HasBeenCancelled() const override { return cancelled; }
     int cancelAfterMoves = 0;
@@ -52,7 +58,7 @@ protected:
         tracker->SetTrackedWindow(main->GetPlatformWindow());
         workspace->SetTracker(std::move(tracker));
         bool cancelled = true;
-        raw->Begin(at, cancelled);
+        raw->Begin(at, &cancelled);
         EXPECT_FALSE(cancelled);
         return raw;
     }
@@ -167,7 +173,7 @@ TEST_F(Platform, LosingTheCaptureOrCancellingEndsTheTrackerCancelled) {
     PointT start(client.left + 50, client.top + 50);
     StartTracking(start);
     Desktop::Get().ReleaseCapture();
-    EXPECT_EQ(trackLog, (std::vector<std::string>{"end cancelled"}));
+    EXPECT_EQ(trackLog, (std::vector<std::string>{"cancel", "end"}));
     EXPECT_EQ(workspace->GetTracker(), nullptr);
 
     trackLog.clear();
