@@ -7,6 +7,7 @@
 #include "host/core/PropList.h"
 #include "host/ui/Desktop.h"
 #include "host/ui/canvasor/Canvasor.h"
+#include "host/ui/controls/TabWell.h"
 #include "support/SnapshotOnFailure.h"
 #include "workspace/TabCreator.h"
 #include "workspace/TabPanel.h"
@@ -138,6 +139,22 @@ protected:
         right = main->AddTabbedFrame(left, "browser", LayoutManager::Right);
     }
     static PaintedPanel* Painted(TabPanel* panel) { return dynamic_cast<PaintedPanel*>(panel); }
+
+    // --- Pointing at things on the desktop ---
+    static PointT Middle(RectT const& r) { return PointT(r.left + r.width / 2, r.top + r.height / 2); }
+    static void Click(PointT p) {
+        Desktop::Get().MouseMove(p);
+        Desktop::Get().MouseDown(p);
+        Desktop::Get().MouseUp(p);
+    }
+    static PointT OnTab(WorkspaceFrame* frame, long index) {
+        return Middle(frame->GetTabWell()->GetTabGlobalRect(index));
+    }
+    static canvasor::ColorRGBA SeenAt(PointT p) { return Desktop::Get().Snapshot().Pixel(p.x, p.y); }
+    static bool Looks(canvasor::ColorRGBA seen, canvasor::ColorRGBA expected, float tolerance = 0.01f) {
+        auto near = [&](float a, float b) { return a - b < tolerance && b - a < tolerance; };
+        return near(seen.r, expected.r) && near(seen.g, expected.g) && near(seen.b, expected.b);
+    }
 
     NativeWindow appWindow = 0;
     boost::intrusive_ptr<HostWorkspace> workspace;

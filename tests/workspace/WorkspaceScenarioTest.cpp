@@ -24,15 +24,6 @@ protected:
         Desktop::Get().Activate(appWindow);
     }
 
-    static PointT Middle(RectT const& r) { return PointT(r.left + r.width / 2, r.top + r.height / 2); }
-    static void Click(PointT p) {
-        Desktop::Get().MouseMove(p);
-        Desktop::Get().MouseDown(p);
-        Desktop::Get().MouseUp(p);
-    }
-    static PointT OnTab(WorkspaceFrame* frame, long index) {
-        return Middle(frame->GetTabWell()->GetTabGlobalRect(index));
-    }
     static PointT OnCloseBox(WorkspaceFrame* frame, long index) {
         auto* item = frame->GetTabWell()->GetTab(index);
         RectF box = item->CloseBoxRect();
@@ -53,11 +44,6 @@ protected:
             }
             ADD_FAILURE() << "no menu item with command " << long(command);
         }});
-    }
-    canvasor::ColorRGBA SeenAt(PointT p) { return Desktop::Get().Snapshot().Pixel(p.x, p.y); }
-    static bool Looks(canvasor::ColorRGBA seen, canvasor::ColorRGBA expected) {
-        auto near = [](float a, float b) { return a - b < 0.01f && b - a < 0.01f; };
-        return near(seen.r, expected.r) && near(seen.g, expected.g) && near(seen.b, expected.b);
     }
 
     TabPanel* mixer = nullptr;
