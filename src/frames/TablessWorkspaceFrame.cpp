@@ -4,10 +4,12 @@
 #include "frames/WorkspaceBorderElement.h"
 #include "host/core/Error.h"
 #include "host/core/ErrorTable.h"
+#include "host/ui/Desktop.h"
 #include "host/ui/Theme.h"
 #include "host/ui/canvasor/Canvasor.h"
 #include "host/ui/controls/TabWell.h"
 #include "workspace/TabCreator.h"
+#include "workspace/TabDragger.h"
 #include "workspace/TopLevelWindow.h"
 #include "workspace/Workspace.h"
 
@@ -158,10 +160,27 @@ void TablessWorkspaceFrame::HandleTabItemAction(int, long, RectT const*) {
             break;
         }
     }
-    boost::intrusive_ptr<TopLevelWindow> floating = workspace->AddTopLevelWindow(false, &rect);
-    floating->CreateRootFrame(panel, true);
+    std::vector<boost::intrusive_ptr<TabPanel>> panels{panel};
+    boost::intrusive_ptr<TopLevelWindow> floating =
+        workspace->CreateDragSrcWindow(rect, PointT(rect.left, rect.top), panels);
+    if (!floating) {
+        return;
+    }
     floating->UI_Show(true);
-    workspace->SetFocusedTabPanel(panel.get());
+    // The press that tore the panel off goes on as a drag of the new window's tab.
+    WorkspaceFrame* root = floating->GetRootFrame();
+    auto* dragger = root ? dynamic_cast<TabDragger*>(workspace->AcquireTabDragger(root, false, 0)) : nullptr;
+    if (!dragger) {
+        workspace->MakeWindowPermanent(floating);
+        return;
+    }
+    dragger->AdoptDragWindow(floating);
+    dragger->SetTrackedWindow(floating->GetPlatformWindow());
+    bool endAtOnce = false;
+    dragger->Begin(orvui::ui::Desktop::Get().GetMousePosition(), &endAtOnce);
+    if (endAtOnce) {
+        workspace->ReleaseTracker(false);
+    }
 }
 
 void TablessWorkspaceFrame::UI_Draw(canvasor::Canvasor& c) {

@@ -9,6 +9,7 @@
 
 #include "layout/DropZone.h"
 #include "platform/OS_TabDragger.h"
+#include "workspace/TopLevelWindow.h"
 #include "workspace/Tracker.h"
 
 #include <boost/intrusive_ptr.hpp>
@@ -34,6 +35,10 @@ public:
     void DetachFrameWindow(TopLevelWindow* window, WorkspaceFrame* frame);
     // Removes an emptied window (remembered when it had placeholders to bring back).
     void DetachTopLevelWindow(TopLevelWindow* window);
+
+    // A floating interim window made before the drag (a panel torn off a window edge) that already
+    // carries the content and follows the pointer.
+    void AdoptDragWindow(boost::intrusive_ptr<TopLevelWindow> window) { dragWindow_ = std::move(window); }
 
     // --- What tests and overlays look at ---
     WorkspaceFrame* GetSourceFrame() const { return sourceFrame_.get(); }

@@ -4,6 +4,7 @@
 // story the saved document must survive a save, restore and save unchanged.
 #include "WorkspaceDoubles.h"
 
+#include "frames/TablessWorkspaceFrame.h"
 #include "host/core/PropList.h"
 #include "layout/Splitter.h"
 #include "persistence/WorkspaceDocument.h"
@@ -476,4 +477,176 @@ TEST_F(Dragging, AWindowsOnlyFrameIsNotOfferedThatWindowsEdges) {
     ASSERT_NE(window->GetEdgeDropZoneOverlay(), nullptr);
     Release(Middle(edge));
     EXPECT_EQ(window->GetFrameCount(), 2u);
+}
+
+// --- Bars along the window's edges ---
+
+TEST_F(Dragging, ABarTornOffByItsGripperFollowsThePointerAndStaysWhereDropped) {
+    main->SetStaticElement(new ToolBar(workspace.get(), true), LayoutManager::Top, true);
+    TabPanel* bar = main->GetStaticElement(LayoutManager::Top);
+    auto* holder = dynamic_cast<TablessWorkspaceFrame*>(bar->GetFrame());
+    ASSERT_NE(holder, nullptr);
+    PointT grip = Middle(holder->GetDragger()->UI_GetGlobalRect());
+    Press(grip);
+    // The bar left its edge at once and rides in an interim window under the pointer.
+    EXPECT_FALSE(main->HasStaticElement(LayoutManager::Top));
+    ASSERT_NE(Dragger(), nullptr);
+    TopLevelWindow* floating = Dragger()->GetDragWindow();
+    ASSERT_NE(floating, nullptr);
+    EXPECT_EQ(Desktop::Get().GetCapture(), floating->GetPlatformWindow());
+    RectT outer = main->UI_GetGlobalStructureRect();
+    PointT away(outer.Right() + 200, outer.top + 300);
+    MoveTo(PointT(away.x - 20, away.y));
+    MoveTo(away);
+    RectT at = floating->UI_GetGlobalStructureRect();
+    EXPECT_TRUE(at.Contains(away));
+    Release(away);
+    EXPECT_FALSE(floating->IsInterim());
+    EXPECT_EQ(FrameHolding(bar)->GetTopLevelWindow(), floating);
+    EXPECT_EQ(workspace->GetWindows().size(), 2u);
+}
+
+TEST_F(Dragging, ABarDroppedOnTheMainWindowsTopEdgeBecomesItsToolBar) {
+    boost::intrusive_ptr<TabPanel> toolbar(new ToolBar(workspace.get(), true));
+    right->AddTab(toolbar, true); // right: browser, mixer, toolbar
+    RectT edge;
+    main->GetEdgeDropZoneRect(DropZone::Top, edge, true);
+    Press(OnTab(right, 2));
+    MoveTo(Middle(left->UI_GetGlobalRect()));
+    MoveTo(Middle(edge));
+    ASSERT_NE(main->GetEdgeDropZoneOverlay(), nullptr);
+    Release(Middle(edge));
+    EXPECT_EQ(main->GetStaticElement(LayoutManager::Top), toolbar.get());
+    EXPECT_EQ(TabTypes(right), (std::vector<std::string>{"browser", "mixer"}));
+    EXPECT_EQ(main->GetFrameCount(), 2u);
+}
+
+// --- Ending ---
+
+TEST_F(Dragging, EscapeOrALostCaptureEndsATabDragWithoutDocking) {
+    int beeps = Desktop::Get().GetBeepCount();
+    Press(OnTab(right, 1));
+    MoveTo(Middle(left->UI_GetGlobalRect()));
+    ASSERT_NE(main->GetDropZoneOverlay(), nullptr);
+    Desktop::Get().KeyDown(orvui::ui::key::Escape);
+    EXPECT_EQ(workspace->GetTracker(), nullptr);
+    EXPECT_EQ(Desktop::Get().GetBeepCount(), beeps + 1);
+    EXPECT_EQ(main->GetDropZoneOverlay(), nullptr);
+    Desktop::Get().MouseUp(Middle(left->UI_GetGlobalRect()));
+    EXPECT_EQ(TabTypes(right), (std::vector<std::string>{"browser", "mixer"}));
+    EXPECT_EQ(TabTypes(left), std::vector<std::string>{"editor"});
+
+    // Torn off, then the capture is lost: the floating window stays, made permanent.
+    RectT outer = main->UI_GetGlobalStructureRect();
+    Press(OnTab(right, 1));
+    MoveTo(PointT(outer.Right() + 100, outer.top + 100));
+    TopLevelWindow* floating = Dragger()->GetDragWindow();
+    ASSERT_NE(floating, nullptr);
+    Desktop::Get().ReleaseCapture();
+    EXPECT_EQ(workspace->GetTracker(), nullptr);
+    EXPECT_EQ(Desktop::Get().GetBeepCount(), beeps + 2);
+    EXPECT_FALSE(floating->IsInterim());
+    EXPECT_EQ(FrameHolding(mixer)->GetTopLevelWindow(), floating);
+    Desktop::Get().MouseUp(PointT(outer.Right() + 100, outer.top + 100));
+}
+
+TEST_F(Dragging, TheHostHearsWhenDragsBeginAndEnd) {
+    class Listening : public HostWorkspace {
+    public:
+        void NotifyTabDragBegin(TabPanel* p) override { log.push_back("tab begin " + p->GetTabType()); }
+        void NotifyTabDragEnd(TabPanel* p) override { log.push_back("tab end " + p->GetTabType()); }
+        void NotifySplitterDragBegin(TopLevelWindow*) override { log.push_back("bar begin"); }
+        void NotifySplitterDragEnd(TopLevelWindow*) override { log.push_back("bar end"); }
+    };
+    CloseWindows();
+    Desktop::Reset();
+    DesktopScenario::SetUp();
+    appWindow = Desktop::Get().CreateNativeWindow(
+        u"Host", orvui::ui::style::Popup | orvui::ui::style::Caption | orvui::ui::style::Visible, 0, 0,
+        RectT(100, 80, 1000, 700));
+    workspace = new Listening;
+    Register({"editor", EditorPaint});
+    Register({"browser", BrowserPaint});
+    workspace->AttachToClientApp(nullptr, nullptr, appWindow, nullptr, false);
+    main = workspace->GetMainTopLevelWindow();
+    BuildTwoFrames();
+    PointT bar = Bar();
+    Press(bar);
+    MoveTo(PointT(bar.x + 30, bar.y));
+    Release(PointT(bar.x + 30, bar.y));
+    PointT tab = OnTab(right, 0);
+    Press(tab);
+    Release(tab);
+    EXPECT_EQ(workspace->log,
+              (std::vector<std::string>{"bar begin", "bar end", "tab begin browser", "tab end browser"}));
+    // A second drag replaces the first, which ends.
+    Press(tab);
+    ASSERT_NE(workspace->GetTracker(), nullptr);
+    workspace->AcquireSplitterDragger(main, main->UI_GlobalToLocal(Bar()));
+    EXPECT_EQ(workspace->log.back(), "tab end browser");
+    workspace->ReleaseTracker(false);
+    Desktop::Get().MouseUp(tab);
+}
+
+// --- Overlay hit tests ---
+
+TEST(DropZoneOverlay, PointsOnAnEdgeAreInsideAndDegeneratePolygonsHoldLittle) {
+    using Overlay = DropZoneOverlayWindow;
+    std::vector<PointT> square{PointT(0, 0), PointT(10, 0), PointT(10, 10), PointT(0, 10)};
+    EXPECT_TRUE(Overlay::PolygonContains(square, PointT(5, 5)));
+    EXPECT_TRUE(Overlay::PolygonContains(square, PointT(10, 5))); // on the right edge
+    EXPECT_TRUE(Overlay::PolygonContains(square, PointT(5, 10))); // on the bottom edge
+    EXPECT_FALSE(Overlay::PolygonContains(square, PointT(11, 5)));
+    EXPECT_FALSE(Overlay::PolygonContains(square, PointT(-1, 5)));
+    std::vector<PointT> repeated{PointT(0, 0), PointT(0, 0), PointT(10, 0), PointT(10, 10), PointT(10, 10)};
+    EXPECT_TRUE(Overlay::PolygonContains(repeated, PointT(8, 3)));
+    EXPECT_FALSE(Overlay::PolygonContains(repeated, PointT(3, 8)));
+    EXPECT_FALSE(Overlay::PolygonContains({}, PointT(0, 0)));
+    EXPECT_TRUE(Overlay::PolygonContains({PointT(4, 4), PointT(4, 4)}, PointT(4, 4)));
+    EXPECT_FALSE(Overlay::PolygonContains({PointT(4, 4)}, PointT(4, 5)));
+    // A trapezoid like an edge band's.
+    std::vector<PointT> band{PointT(0, 0), PointT(100, 0), PointT(90, 10), PointT(10, 10)};
+    EXPECT_TRUE(Overlay::PolygonContains(band, PointT(50, 5)));
+    EXPECT_FALSE(Overlay::PolygonContains(band, PointT(2, 9)));
+    EXPECT_TRUE(Overlay::PolygonContains(band, PointT(5, 5))); // on the slanted side
+}
+
+TEST_F(Dragging, OverlaysKeepOffTheWindowsEdgeZonesAndPaintAnEdgeAsItsWholeRectangle) {
+    Press(OnTab(right, 1));
+    MoveTo(Middle(left->UI_GetGlobalRect()));
+    FrameDropZoneOverlayWindow* overlay = main->GetFrameDropZoneOverlay();
+    ASSERT_NE(overlay, nullptr);
+    // The left frame lies along the window's left edge: its overlay starts where that edge's zone ends.
+    RectT frame = left->UI_LocalToGlobal(left->GetFrameRect());
+    RectT bounds;
+    overlay->GetGlobalRect(&bounds);
+    std::vector<long> exclusions;
+    main->CalculateDropZoneExclusionsForEdges(frame, exclusions);
+    ASSERT_GT(exclusions[1], 0);
+    EXPECT_EQ(bounds.left, frame.left + exclusions[1]);
+    EXPECT_EQ(Desktop::Get().Record(overlay->GetPlatformWindow())->rect.left, bounds.left);
+    // Zones are tried in order: the first that holds the point wins.
+    PointT centre = InZone(overlay, DropZone::Center);
+    EXPECT_EQ(overlay->DropZoneFromPoint(centre), DropZone::Center);
+    EXPECT_EQ(overlay->DropZoneFromPoint(PointT(-100, -100)), DropZone::None);
+
+    RectT edge;
+    main->GetEdgeDropZoneRect(DropZone::Left, edge, true);
+    MoveTo(Middle(edge));
+    EdgeDropZoneOverlayWindow* edgeOverlay = main->GetEdgeDropZoneOverlay();
+    ASSERT_NE(edgeOverlay, nullptr);
+    EXPECT_EQ(edgeOverlay->GetZoneCount(), 1u);
+    RectT shown = Desktop::Get().Record(edgeOverlay->GetPlatformWindow())->rect;
+    edgeOverlay->GetGlobalRect(&bounds);
+    EXPECT_EQ(bounds, RectT(shown.left + 1, shown.top + 1, shown.width - 2, shown.height - 2));
+    // The whole rectangle is filled green-blue, corners too, though the hit test is the trapezoid.
+    canvasor::Image image(shown.width, shown.height);
+    {
+        canvasor::Canvasor c(image);
+        edgeOverlay->UI_Draw(c);
+    }
+    canvasor::ColorRGBA corner = image.Pixel(shown.width / 2, 2);
+    EXPECT_TRUE(Looks(corner, canvasor::ColorRGBA{0, 0.7f, 0.5f, 1}, 0.02f));
+    Release(Middle(edge));
+    DropTabInZone(FrameHolding(mixer), 0, right, DropZone::Center);
 }

@@ -16,18 +16,6 @@ using orvui::ui::RectT;
 namespace {
 
 // A tool bar 30 units high that may be torn off.
-class ToolBar : public SizedPanel, public WorkspaceBorderElement {
-public:
-    ToolBar(Workspace* ws, bool rippable)
-        : SizedPanel(ws, {PointT(0, 30)})
-        , rippable_(rippable) {}
-    bool IsRippable() override { return rippable_; }
-    void ConvertToRegularTab() override { ++conversions; }
-    int conversions = 0;
-
-private:
-    bool rippable_;
-};
 
 using WindowFeatures = WorkspaceTest;
 

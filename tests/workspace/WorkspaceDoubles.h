@@ -3,6 +3,7 @@
 // fixture that attaches the workspace to a host application window on a fresh headless desktop.
 #pragma once
 
+#include "frames/WorkspaceBorderElement.h"
 #include "frames/WorkspaceFrame.h"
 #include "host/core/PropList.h"
 #include "host/ui/Desktop.h"
@@ -66,6 +67,20 @@ private:
         out.insert(out.end(), snapSizes_.begin(), snapSizes_.end());
     }
     std::vector<orvui::ui::PointT> snapSizes_;
+};
+
+// A bar that can sit along a window edge; rippable bars show a gripper to tear them off.
+class ToolBar : public SizedPanel, public WorkspaceBorderElement {
+public:
+    ToolBar(Workspace* ws, bool rippable)
+        : SizedPanel(ws, {PointT(0, 30)})
+        , rippable_(rippable) {}
+    bool IsRippable() override { return rippable_; }
+    void ConvertToRegularTab() override { ++conversions; }
+    int conversions = 0;
+
+private:
+    bool rippable_;
 };
 
 struct PanelKind {
