@@ -124,3 +124,48 @@ TEST_F(DesktopTest, SnapshotShowsChromeBackgroundNodesAndOpacity) {
     shot = desktop().Snapshot();
     EXPECT_TRUE(Near(shot.Pixel(client.left + 5, client.top + 5), GetColor(color::WindowBackground)));
 }
+
+TEST_F(DesktopTest, ANodesChangeRepaintsOnlyItsAreaAndMatchesAWholeRepaint) {
+    auto window = MakeWindow(RectT(100, 100, 400, 300));
+    boost::intrusive_ptr<Swatch> left(new Swatch(ColorRGBA(1, 0, 0, 1)));
+    boost::intrusive_ptr<Swatch> right(new Swatch(ColorRGBA(0, 1, 0, 1)));
+    boost::intrusive_ptr<Swatch> inner(new Swatch(ColorRGBA(0, 0, 1, 1)));
+    window->ChildPushBack(left);
+    window->ChildPushBack(right);
+    right->ChildPushBack(inner);
+    left->UI_SetRect(RectF(0, 0, 150, 200));
+    right->UI_SetRect(RectF(150, 0, 150, 200));
+    inner->UI_SetRect(RectF(10.5f, 10.5f, 40, 40)); // straddles pixels: its edges are blended
+    NativeWindow w = window->GetPlatformWindow();
+    Image before = desktop().WindowImage(w);
+    EXPECT_FALSE(desktop().IsDirty(w));
+
+    // A change inside the right node marks only its area; the image handed out before keeps its pixels.
+    right->color = ColorRGBA(1, 1, 0, 1);
+    inner->UI_SetRect(RectF(60.5f, 30.5f, 40, 40)); // moved: its old place is marked too
+    right->UI_Invalidate();
+    EXPECT_TRUE(desktop().IsDirty(w));
+    RectT client = window->UI_GetGlobalClientRect();
+    int cx = client.left - 100, cy = client.top - 100;
+    RectT marked = desktop().Record(w)->dirtyArea;
+    EXPECT_FALSE(marked.IsEmpty());
+    EXPECT_TRUE(marked.Intersection(RectT(cx, cy, 140, 200)).IsEmpty()); // the left node is left alone
+    window->UI_UpdateNow();
+    EXPECT_FALSE(desktop().IsDirty(w));
+    Image partial = desktop().WindowImage(w);
+    EXPECT_TRUE(Near(before.Pixel(cx + 200, cy + 100), ColorRGBA(0, 1, 0, 1)));
+    EXPECT_TRUE(Near(partial.Pixel(cx + 200, cy + 100), ColorRGBA(1, 1, 0, 1)));
+
+    // Painted whole, the window looks the same pixel for pixel.
+    desktop().Invalidate(w);
+    Image whole = desktop().WindowImage(w);
+    ASSERT_EQ(whole.Width(), partial.Width());
+    int differing = 0;
+    for (int y = 0; y < whole.Height(); ++y) {
+        for (int x = 0; x < whole.Width(); ++x) {
+            ColorRGBA a = whole.Pixel(x, y), b = partial.Pixel(x, y);
+            differing += a.r != b.r || a.g != b.g || a.b != b.b || a.a != b.a;
+        }
+    }
+    EXPECT_EQ(differing, 0);
+}

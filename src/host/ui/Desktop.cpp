@@ -303,14 +303,28 @@ void Desktop::Invalidate(NativeWindow w) {
     }
 }
 
+void Desktop::InvalidateArea(NativeWindow w, RectT const& global) {
+    NativeWindowRecord* record = Find(TopLevelOf(w));
+    if (!record || record->dirty) {
+        return;
+    }
+    RectT r = record->rect;
+    RectT area = RectT(global.left - r.left, global.top - r.top, global.width, global.height)
+                     .Intersection(RectT(0, 0, r.width, r.height));
+    if (!area.IsEmpty()) {
+        record->dirtyArea = record->dirtyArea.Union(area);
+    }
+}
+
 bool Desktop::IsDirty(NativeWindow w) const {
     NativeWindowRecord const* record = Find(TopLevelOf(w));
-    return record && record->dirty;
+    return record && (record->dirty || !record->dirtyArea.IsEmpty());
 }
 
 void Desktop::ClearDirty(NativeWindow w) {
     if (NativeWindowRecord* record = Find(TopLevelOf(w))) {
         record->dirty = false;
+        record->dirtyArea = RectT();
     }
 }
 

@@ -65,7 +65,9 @@ struct NativeWindowRecord {
     float opacity = 1.0f;
     bool hasMenu = false;
     bool captionActive = false;
+    // The whole window needs painting; otherwise dirtyArea (window coordinates) is what does.
     bool dirty = true;
+    RectT dirtyArea;
     ShowState showState = ShowState::Normal;
     // Placement flags: 2 restores a minimised window to maximised.
     unsigned placementFlags = 0;
@@ -135,11 +137,17 @@ public:
     // whether it was disabled before.
     bool EnableWindow(NativeWindow w, bool enable);
     bool IsEnabled(NativeWindow w) const;
+    // Marks a window's whole top-level window for painting.
     void Invalidate(NativeWindow w);
+    // Marks part of a window (global coordinates) for painting; the marks of a window add up.
+    void InvalidateArea(NativeWindow w, RectT const& global);
     bool IsDirty(NativeWindow w) const;
     void ClearDirty(NativeWindow w);
     // Paints a top-level window's image now (its chrome, then its nodes) and clears its mark.
     void PaintWindow(NativeWindow w);
+    // Paints what is marked of a top-level window: only the marked area when no more is marked
+    // (the window's nodes that meet it, over the background), else the whole window.
+    void PaintDirty(NativeWindow w);
     // The window's image, painted first when it is marked.
     canvasor::Image WindowImage(NativeWindow w);
     // The shown windows composited bottom to top, with their opacity, over the area of all the

@@ -14,11 +14,25 @@ namespace {
 
 using canvasor::Canvasor;
 
-void DrawNode(UI_Node* node, Canvasor& c, bool isRoot) {
+bool Meet(RectF const& a, RectF const& b) {
+    return a.left < b.left + b.width && b.left < a.left + a.width && a.top < b.top + b.height &&
+           b.top < a.top + a.height;
+}
+
+// Draws a node and its children; with an area (in the node's parent's coordinates, the root's own
+// for the root) only the nodes that meet it.
+void DrawNode(UI_Node* node, Canvasor& c, bool isRoot, RectF const* area = nullptr) {
     if (!node->UI_IsShown()) {
         return;
     }
     RectF r = node->UI_GetRect();
+    if (area && !isRoot && !Meet(r, *area)) {
+        return;
+    }
+    RectF inner;
+    if (area) {
+        inner = isRoot ? *area : RectF(area->left - r.left, area->top - r.top, area->width, area->height);
+    }
     c.Save();
     if (!isRoot) {
         c.Translate(r.left, r.top);
@@ -35,7 +49,7 @@ void DrawNode(UI_Node* node, Canvasor& c, bool isRoot) {
         if (OS_Window* w = child->UI_GetOSWindow(); w && w->IsTopLevel()) {
             continue; // a separate window, painted on its own
         }
-        DrawNode(child, c, false);
+        DrawNode(child, c, false, area ? &inner : nullptr);
     }
     if (layered) {
         c.PopOpacity(node->UI_GetOpacity());
@@ -95,7 +109,47 @@ void Desktop::PaintWindow(NativeWindow w) {
     if (record) {
         record->image = image;
         record->dirty = false;
+        record->dirtyArea = RectT();
     }
+}
+
+void Desktop::PaintDirty(NativeWindow w) {
+    NativeWindow top = TopLevelOf(w);
+    NativeWindowRecord* record = Find(top);
+    if (!record) {
+        return;
+    }
+    RectT r = record->rect;
+    RectT client = GetClientRect(top);
+    RectT clientArea(client.left - r.left, client.top - r.top, client.width, client.height);
+    // Only the inside of an opaque window that keeps its size is painted in parts; anything else
+    // (chrome, a layered window's transparency, a new size) is painted whole.
+    bool whole = record->dirty || record->image.IsEmpty() || record->image.Width() != r.width ||
+                 record->image.Height() != r.height || (record->exStyle & style::Layered) ||
+                 !record->object || record->dirtyArea.Intersection(clientArea) != record->dirtyArea;
+    if (whole) {
+        if (record->dirty || !record->dirtyArea.IsEmpty() || record->image.IsEmpty()) {
+            PaintWindow(top);
+        }
+        return;
+    }
+    if (record->dirtyArea.IsEmpty()) {
+        return;
+    }
+    RectT area = record->dirtyArea;
+    record->dirtyArea = RectT();
+    if (record->image.IsShared()) {
+        record->image = record->image.Clone(); // images handed out keep what they showed
+    }
+    canvasor::Image image = record->image;
+    Canvasor c(image);
+    RectF areaF(float(area.left), float(area.top), float(area.width), float(area.height));
+    c.ClipRect(areaF);
+    c.FillRect(areaF, GetColor(color::WindowBackground));
+    c.Translate(float(clientArea.left), float(clientArea.top));
+    RectF inClient(areaF.left - float(clientArea.left), areaF.top - float(clientArea.top), areaF.width,
+                   areaF.height);
+    DrawNode(record->object, c, true, &inClient);
 }
 
 canvasor::Image Desktop::WindowImage(NativeWindow w) {
@@ -104,9 +158,7 @@ canvasor::Image Desktop::WindowImage(NativeWindow w) {
     if (!record) {
         return canvasor::Image();
     }
-    if (record->dirty || record->image.IsEmpty()) {
-        PaintWindow(top);
-    }
+    PaintDirty(top);
     return Find(top)->image;
 }
 

@@ -156,7 +156,7 @@ bool OS_Window::UI_Close() {
 
 void OS_Window::UpdateWindowNow() {
     if (window_) {
-        Desktop::Get().PaintWindow(window_);
+        Desktop::Get().PaintDirty(window_);
     }
 }
 

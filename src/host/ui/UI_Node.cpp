@@ -239,15 +239,32 @@ void UI_Node::UI_SetOpacity(float opacity) {
     UI_Invalidate();
 }
 
-void UI_Node::UI_Invalidate(RectF const*, unsigned) {
-    for (UI_Node* n = this; n; n = n->parent_) {
+void UI_Node::UI_Invalidate(RectF const* area, unsigned) {
+    // A top-level window invalidated as a whole is painted whole; any other node marks only its own
+    // area (or the given part of it), so that painting it again costs what it covers.
+    if (OS_Window* self = UI_GetOSWindow();
+        self && self->GetPlatformWindow() && self->IsTopLevel() && !area) {
+        Desktop::Get().Invalidate(self->GetPlatformWindow());
+        return;
+    }
+    OS_Window* window = nullptr;
+    for (UI_Node* n = this; n && !window; n = n->parent_) {
         if (OS_Window* w = n->UI_GetOSWindow(); w && w->GetPlatformWindow()) {
-            Desktop::Get().Invalidate(w->GetPlatformWindow());
-            if (w->IsTopLevel()) {
-                return;
-            }
+            window = w;
         }
     }
+    if (!window) {
+        return;
+    }
+    RectF local = area ? *area : UI_GetLocalBounds();
+    // Rounded outwards, with a pixel to spare for strokes that straddle the edges.
+    PointT topLeft = UI_LocalToGlobal(
+        PointT(std::int32_t(std::floor(local.left)) - 1, std::int32_t(std::floor(local.top)) - 1));
+    PointT bottomRight = UI_LocalToGlobal(PointT(std::int32_t(std::ceil(local.left + local.width)) + 1,
+                                                 std::int32_t(std::ceil(local.top + local.height)) + 1));
+    Desktop::Get().InvalidateArea(
+        window->GetPlatformWindow(),
+        RectT(topLeft.x, topLeft.y, bottomRight.x - topLeft.x, bottomRight.y - topLeft.y));
 }
 
 void UI_Node::UI_UpdateNow(unsigned) {

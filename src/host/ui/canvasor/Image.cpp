@@ -56,6 +56,21 @@ Image Image::FromPNG(std::string const& bytes) {
     return image;
 }
 
+Image Image::Clone() const {
+    if (!surface_) {
+        return Image();
+    }
+    Image copy(Width(), Height());
+    cairo_surface_flush(surface_.get());
+    cairo_t* cr = cairo_create(copy.surface_.get());
+    cairo_set_operator(cr, CAIRO_OPERATOR_SOURCE);
+    cairo_set_source_surface(cr, surface_.get(), 0, 0);
+    cairo_paint(cr);
+    cairo_destroy(cr);
+    cairo_surface_flush(copy.surface_.get());
+    return copy;
+}
+
 int Image::Width() const {
     return surface_ ? cairo_image_surface_get_width(surface_.get()) : 0;
 }

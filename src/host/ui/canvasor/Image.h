@@ -29,6 +29,10 @@ public:
     // Writes the PNG to a file; false when it cannot.
     bool WritePNG(std::string const& path) const;
     cairo_surface_t* Surface() const { return surface_.get(); }
+    // Whether another copy shares the pixels.
+    bool IsShared() const { return surface_.use_count() > 1; }
+    // A copy with pixels of its own.
+    Image Clone() const;
 
 private:
     std::shared_ptr<cairo_surface_t> surface_;
