@@ -123,21 +123,21 @@ void Desktop::PaintDirty(NativeWindow w) {
     RectT client = GetClientRect(top);
     RectT clientArea(client.left - r.left, client.top - r.top, client.width, client.height);
     // Only the inside of an opaque window that keeps its size is painted in parts; anything else
-    // (chrome, a layered window's transparency, a new size) is painted whole.
+    // (a layered window's transparency, a new size) is painted whole. Nodes mark only what lies in
+    // the client area, so a mark is clipped to it.
     bool whole = record->dirty || record->image.IsEmpty() || record->image.Width() != r.width ||
-                 record->image.Height() != r.height || (record->exStyle & style::Layered) ||
-                 !record->object || record->dirtyArea.Intersection(clientArea) != record->dirtyArea;
+                 record->image.Height() != r.height || (record->exStyle & style::Layered) || !record->object;
     if (whole) {
         if (record->dirty || !record->dirtyArea.IsEmpty() || record->image.IsEmpty()) {
             PaintWindow(top);
         }
         return;
     }
-    if (record->dirtyArea.IsEmpty()) {
+    RectT area = record->dirtyArea.Intersection(clientArea);
+    record->dirtyArea = RectT();
+    if (area.IsEmpty()) {
         return;
     }
-    RectT area = record->dirtyArea;
-    record->dirtyArea = RectT();
     if (record->image.IsShared()) {
         record->image = record->image.Clone(); // images handed out keep what they showed
     }
