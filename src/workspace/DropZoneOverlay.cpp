@@ -29,52 +29,38 @@ OS_TopLevelWindow* MainWindowOf(TopLevelWindow* window) {
 
 // --- OverlayWindow and OverlayView ---
 
-OverlayWindow::OverlayWindow(OS_TopLevelWindow* owner, OS_TopLevelWindow* window, orvui::ui::OS_Window* view,
+BackedOverlay::BackedOverlay(OS_TopLevelWindow* owner, OS_TopLevelWindow* window, orvui::ui::OS_Window* view,
                              RectT const& rect, bool plainView)
-    : OS_OverlayWindow(PlatformWindowOf(owner), PlatformWindowOf(window), view, rect, plainView) {
-    UI_SetNodeID("OverlayWindow");
-}
+    : OS_OverlayWindow(PlatformWindowOf(owner), PlatformWindowOf(window), view, rect, plainView) {}
 
-void OverlayWindow::UI_Show(bool show) {
+void BackedOverlay::UI_Show(bool show) {
     if (OSWindowBacked()) {
         OS_Window::UI_Show(show);
     }
 }
 
-void OverlayWindow::UI_SetOpacity(float opacity) {
+void BackedOverlay::UI_SetOpacity(float opacity) {
     if (OSWindowBacked()) {
         OS_Window::UI_SetOpacity(opacity);
     }
 }
 
-void OverlayWindow::UI_Invalidate() {
+void BackedOverlay::UI_Invalidate() {
     if (OSWindowBacked()) {
         OS_Window::UI_Invalidate();
     }
+}
+
+OverlayWindow::OverlayWindow(OS_TopLevelWindow* owner, OS_TopLevelWindow* window, orvui::ui::OS_Window* view,
+                             RectT const& rect, bool plainView)
+    : BackedOverlay(owner, window, view, rect, plainView) {
+    UI_SetNodeID("OverlayWindow");
 }
 
 OverlayView::OverlayView(OS_TopLevelWindow* owner, OS_TopLevelWindow* window, orvui::ui::OS_Window* view,
                          RectT const& rect, bool plainView)
-    : OS_OverlayWindow(PlatformWindowOf(owner), PlatformWindowOf(window), view, rect, plainView) {
+    : BackedOverlay(owner, window, view, rect, plainView) {
     UI_SetNodeID("OverlayView");
-}
-
-void OverlayView::UI_Show(bool show) {
-    if (OSWindowBacked()) {
-        OS_Window::UI_Show(show);
-    }
-}
-
-void OverlayView::UI_SetOpacity(float opacity) {
-    if (OSWindowBacked()) {
-        OS_Window::UI_SetOpacity(opacity);
-    }
-}
-
-void OverlayView::UI_Invalidate() {
-    if (OSWindowBacked()) {
-        OS_Window::UI_Invalidate();
-    }
 }
 
 // --- DropZoneOverlayWindow ---

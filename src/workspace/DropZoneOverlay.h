@@ -22,11 +22,11 @@ class TopLevelWindow;
 class Workspace;
 class WorkspaceFrame;
 
-// A generic overlay on the platform's overlay window: showing, opacity and repainting only mean
-// something when a native window backs it.
-class OverlayWindow : public OS_OverlayWindow {
+// What both generic overlays share: showing, opacity and repainting only mean something when a
+// native window backs the overlay.
+class BackedOverlay : public OS_OverlayWindow {
 public:
-    OverlayWindow(OS_TopLevelWindow* owner, OS_TopLevelWindow* window, orvui::ui::OS_Window* view,
+    BackedOverlay(OS_TopLevelWindow* owner, OS_TopLevelWindow* window, orvui::ui::OS_Window* view,
                   RectT const& rect, bool plainView);
     void UI_Show(bool show) override;
     void UI_SetOpacity(float opacity);
@@ -34,15 +34,18 @@ public:
     void BringToTop() override {}
 };
 
-// The same as a view inside another window.
-class OverlayView : public OS_OverlayWindow {
+// A generic overlay window.
+class OverlayWindow : public BackedOverlay {
+public:
+    OverlayWindow(OS_TopLevelWindow* owner, OS_TopLevelWindow* window, orvui::ui::OS_Window* view,
+                  RectT const& rect, bool plainView);
+};
+
+// The same as a view drawn with the canvas.
+class OverlayView : public BackedOverlay {
 public:
     OverlayView(OS_TopLevelWindow* owner, OS_TopLevelWindow* window, orvui::ui::OS_Window* view,
                 RectT const& rect, bool plainView);
-    void UI_Show(bool show) override;
-    void UI_SetOpacity(float opacity);
-    void UI_Invalidate();
-    void BringToTop() override {}
     bool UI_SupportsCanvasor() const override { return true; }
 };
 

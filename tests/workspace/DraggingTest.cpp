@@ -650,3 +650,21 @@ TEST_F(Dragging, OverlaysKeepOffTheWindowsEdgeZonesAndPaintAnEdgeAsItsWholeRecta
     Release(Middle(edge));
     DropTabInZone(FrameHolding(mixer), 0, right, DropZone::Center);
 }
+
+TEST_F(Dragging, AnOverlayWithoutANativeWindowIgnoresShowOpacityAndRepaints) {
+    boost::intrusive_ptr<OverlayView> view(new OverlayView(main, main, nullptr, RectT(), true));
+    EXPECT_FALSE(view->OSWindowBacked());
+    EXPECT_EQ(view->GetPlatformWindow(), 0u);
+    bool shown = view->UI_IsShown();
+    view->UI_Show(!shown);
+    EXPECT_EQ(view->UI_IsShown(), shown);
+    view->UI_SetOpacity(0.3f);
+    EXPECT_FLOAT_EQ(view->UI_GetOpacity(), 1.0f);
+    view->UI_Invalidate();
+    // A backed one does as it is told.
+    boost::intrusive_ptr<OverlayWindow> backed(
+        new OverlayWindow(main, main, nullptr, RectT(300, 300, 50, 50), false));
+    backed->UI_SetOpacity(0.3f);
+    EXPECT_FLOAT_EQ(Desktop::Get().Record(backed->GetPlatformWindow())->opacity, 0.3f);
+    EXPECT_EQ(backed->UI_GetNodeID(), "OverlayWindow");
+}
