@@ -153,6 +153,9 @@ void TablessWorkspaceFrame::HandleTabItemAction(int, long, RectT const*) {
         rect.height = snap.y + std::int32_t(std::lround(dy));
     }
     boost::intrusive_ptr<TabPanel> panel = DetachTabPanel(0);
+    std::vector<boost::intrusive_ptr<TabPanel>> panels{panel};
+    boost::intrusive_ptr<TopLevelWindow> floating =
+        workspace->CreateDragSrcWindow(rect, PointT(rect.left, rect.top), panels);
     // Only this frame's own edge loses its element, whichever edge the frame was on.
     for (auto side : {LayoutManager::Top, LayoutManager::Left, LayoutManager::Bottom, LayoutManager::Right}) {
         if (window->GetLayoutManager()->GetStaticBorderFrame(side) == GetLMFrame()) {
@@ -160,9 +163,6 @@ void TablessWorkspaceFrame::HandleTabItemAction(int, long, RectT const*) {
             break;
         }
     }
-    std::vector<boost::intrusive_ptr<TabPanel>> panels{panel};
-    boost::intrusive_ptr<TopLevelWindow> floating =
-        workspace->CreateDragSrcWindow(rect, PointT(rect.left, rect.top), panels);
     if (!floating) {
         return;
     }
@@ -174,8 +174,10 @@ void TablessWorkspaceFrame::HandleTabItemAction(int, long, RectT const*) {
         workspace->MakeWindowPermanent(floating);
         return;
     }
+    // The capture stays with the main window, as for every drag: the floating window may be
+    // removed while the drag runs (docked into an empty main window), and a capture held by a
+    // removed window would swallow the rest of the drag.
     dragger->AdoptDragWindow(floating);
-    dragger->SetTrackedWindow(floating->GetPlatformWindow());
     bool endAtOnce = false;
     dragger->Begin(orvui::ui::Desktop::Get().GetMousePosition(), &endAtOnce);
     if (endAtOnce) {

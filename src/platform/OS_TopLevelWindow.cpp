@@ -187,7 +187,7 @@ void OS_TopLevelWindow::UI_HandleOSEvent(OS_Event& event) {
             PointT global = Desktop::Get().ClientToGlobal(
                 GetPlatformWindow(), PointT(PointParamX(event.lParam), PointParamY(event.lParam)));
             tracker->Track(global, nullptr);
-            if (tracker->HasBeenCancelled()) {
+            if (workspace_->GetTracker() == tracker && tracker->HasBeenCancelled()) {
                 workspace_->ReleaseTracker(false);
             }
             return;

@@ -26,6 +26,8 @@ public:
     // Abandons the drag with the warning beep.
     virtual void Cancel();
     virtual bool HasBeenCancelled() const = 0;
+    // Whether one of its steps is running now (a release from inside it must not destroy it).
+    virtual bool IsBusy() const { return false; }
 
     void SetTrackedWindow(orvui::ui::NativeWindow window) { trackedWindow_ = window; }
     orvui::ui::NativeWindow GetTrackedWindow() const { return trackedWindow_; }

@@ -157,7 +157,6 @@ void DropZoneOverlayWindow::UI_Draw(canvasor::Canvasor& c) {
                 c.LineTo(p);
             }
         }
-        c.ClosePath();
     };
     DropZone const* active = nullptr;
     for (DropZone const& zone : zones_) {
@@ -167,7 +166,8 @@ void DropZoneOverlayWindow::UI_Draw(canvasor::Canvasor& c) {
         if (activeDropZone_ != DropZone::None && zone.GetType() == activeDropZone_ && !active) {
             active = &zone;
         }
-        if (zone.GetType() != DropZone::TabWell) {
+        // Outlines come with an active zone only: without one the overlay is a plain tint.
+        if (activeDropZone_ != DropZone::None && zone.GetType() != DropZone::TabWell) {
             trace(zone);
             c.Stroke(pen);
         }

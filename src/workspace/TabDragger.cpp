@@ -114,12 +114,12 @@ void TabDragger::UpdateTarget(KeyboardEvent const* keyEvent) {
             window = nullptr;
         }
     }
-    if (window != targetWindow_ && targetWindow_) {
+    if (targetWindow_ && window != targetWindow_.get()) {
         targetWindow_->DestroyDropZoneOverlay();
     }
     targetWindow_ = window;
     targetFrame_ = window ? window->GetFrameFromPos(lastPoint_) : nullptr;
-    if (targetFrame_ != sourceFrame_.get()) {
+    if (targetFrame_ != sourceFrame_) {
         needTabRects_ = true;
         if (!targetWindow_ || !targetWindow_->GetDropZoneOverlay()) {
             currentDropType_ = DropZone::None;
@@ -141,6 +141,7 @@ void TabDragger::Track(PointT const& point, KeyboardEvent const* keyEvent) {
     if (applyingCount_ != 0 || ended_) {
         return;
     }
+    ScIncDec tracking(trackingDepth_);
     lastPoint_ = point;
     UpdateTarget(keyEvent);
     RectT edgeRect;
@@ -209,7 +210,7 @@ void TabDragger::Track(PointT const& point, KeyboardEvent const* keyEvent) {
     if (targetWindow_ && !targetWindow_->GetDropZoneOverlay()) {
         if (!onEdge && targetFrame_ && targetFrame_->GetTabWellGlobalRect().Contains(lastPoint_)) {
             currentDropType_ = DropZone::TabWell;
-            if (targetFrame_ == sourceFrame_.get()) {
+            if (targetFrame_ == sourceFrame_) {
                 Apply(keyEvent, false); // reordered live under the pointer
             }
         } else if (targetWindow_->IsMain() && !targetWindow_->GetRootFrame()) {
@@ -222,11 +223,11 @@ void TabDragger::Track(PointT const& point, KeyboardEvent const* keyEvent) {
         onEdge = false;
     }
     if (targetWindow_ && (targetFrame_ || onEdge)) {
-        bool overSource = targetFrame_ == sourceFrame_.get();
+        bool overSource = targetFrame_ == sourceFrame_;
         bool skip = (overSource && awayFromSourceWell_) ||
                     (overSource && !onEdge && sourceFrame_->GetTabWellGlobalRect().Contains(lastPoint_));
         if (!skip && !targetWindow_->GetDropZoneOverlay()) {
-            WorkspaceFrame* frame = overSource && ContentIsWholeSourceFrame() ? nullptr : targetFrame_;
+            WorkspaceFrame* frame = overSource && ContentIsWholeSourceFrame() ? nullptr : targetFrame_.get();
             if (DropZoneOverlayWindow* overlay =
                     targetWindow_->CreateDropZoneOverlay(this, lastPoint_, frame)) {
                 if (onEdge) {
@@ -273,12 +274,12 @@ std::vector<boost::intrusive_ptr<TabPanel>> TabDragger::TakeContent() {
             DetachFrameWindow(sourceWindow.get(), sourceFrame_.get());
         }
     }
-    if (targetFrame_ == sourceFrame_.get()) {
+    if (targetFrame_ == sourceFrame_) {
         targetFrame_ = nullptr;
     }
     if (sourceWindow && !sourceWindow->GetRootFrame() && !sourceWindow->IsMain() &&
         sourceWindow->UI_GetParentNode()) {
-        if (targetWindow_ == sourceWindow.get()) {
+        if (targetWindow_ == sourceWindow) {
             sourceWindow->DestroyDropZoneOverlay();
         }
         DetachTopLevelWindow(sourceWindow.get());
@@ -346,7 +347,7 @@ void TabDragger::Apply(KeyboardEvent const* keyEvent, bool final) {
     }
 
     // Docking through the overlay's zone.
-    WorkspaceFrame* target = targetFrame_;
+    WorkspaceFrame* target = targetFrame_.get();
     if (DropZoneOverlayWindow* overlay = targetWindow_ ? targetWindow_->GetDropZoneOverlay() : nullptr) {
         currentDropType_ = overlay->GetActiveDropZone();
         if (FrameDropZoneOverlayWindow* frameOverlay = targetWindow_->GetFrameDropZoneOverlay()) {
@@ -375,7 +376,7 @@ void TabDragger::Apply(KeyboardEvent const* keyEvent, bool final) {
     if (currentDropType_ == DropZone::Center && (!target || target == sourceFrame_.get())) {
         return;
     }
-    if (currentDropType_ == appliedDropType_ && target == appliedFrame_ &&
+    if (currentDropType_ == appliedDropType_ && target == appliedFrame_.get() &&
         (currentDropType_ != DropZone::TabWell || index == long(tabIndex_))) {
         return;
     }
@@ -418,6 +419,7 @@ void TabDragger::Apply(KeyboardEvent const* keyEvent, bool final) {
         } else if (!target && type == DropZone::Top && keepTarget->IsMain() &&
                    dynamic_cast<WorkspaceBorderElement*>(dragged)) {
             keepTarget->SetStaticElement(panels.front(), LayoutManager::Top, true);
+            dockedElsewhere_ = panels.front();
         } else {
             holder = keepTarget->AddTabbedFrame(target, panels, dragged, side);
         }
@@ -442,8 +444,13 @@ void TabDragger::Apply(KeyboardEvent const* keyEvent, bool final) {
     default:
         break;
     }
-    CloseOverlay();
+    if (type == DropZone::TabWell) {
+        CloseOverlay();
+    } else if (DropZoneOverlayWindow* overlay = keepTarget->GetDropZoneOverlay()) {
+        overlay->UI_Invalidate();
+    }
     if (holder) {
+        dockedElsewhere_.reset();
         if (dragged && holder->IndexOf(dragged) >= 0) {
             holder->BringTabToFront(dragged);
         }
@@ -460,10 +467,10 @@ void TabDragger::End() {
     }
     ended_ = true;
     Tracker::End();
-    applyingCount_ = 0;
     bool emptyMain = targetWindow_ && targetWindow_->IsMain() && !targetWindow_->GetRootFrame();
-    if (dragStarted_ && targetWindow_ && (targetWindow_->GetDropZoneOverlay() || emptyMain) &&
-        !HasBeenCancelled()) {
+    // Ended from inside a docking step (released by something it set off), it docks nothing more.
+    if (dragStarted_ && applyingCount_ == 0 && targetWindow_ &&
+        (targetWindow_->GetDropZoneOverlay() || emptyMain) && !HasBeenCancelled()) {
         Apply(nullptr, true);
     }
     if (targetWindow_) {
@@ -478,7 +485,7 @@ void TabDragger::End() {
     if (UI_NodeManager* manager = UI_NodeManager::Get()) {
         manager->UI_ClearPreviousKeyboardFocus();
     }
-    TabPanel* front = sourceFrame_->GetFrontTabPanel();
+    TabPanel* front = dockedElsewhere_ ? dockedElsewhere_.get() : sourceFrame_->GetFrontTabPanel();
     if (front) {
         workspace_->SetFocusedTabPanel(front);
     }
@@ -505,7 +512,7 @@ void TabDragger::DetachTopLevelWindow(TopLevelWindow* window) {
         return;
     }
     boost::intrusive_ptr<TopLevelWindow> keep(window);
-    if (window == targetWindow_) {
+    if (window == targetWindow_.get()) {
         window->DestroyDropZoneOverlay();
         targetWindow_ = nullptr;
         targetFrame_ = nullptr;

@@ -30,6 +30,7 @@ public:
     void Track(PointT const& global, orvui::ui::KeyboardEvent const* keyEvent) override;
     void End() override;
     void DoKeyEvent(orvui::ui::KeyboardEvent const& event) override;
+    bool IsBusy() const override { return applyingCount_ > 0 || trackingDepth_ > 0; }
 
     // Takes the source frame out of its window, keeping its place when it still remembers tabs.
     void DetachFrameWindow(TopLevelWindow* window, WorkspaceFrame* frame);
@@ -44,8 +45,8 @@ public:
     WorkspaceFrame* GetSourceFrame() const { return sourceFrame_.get(); }
     bool IsWholeFrame() const { return wholeFrame_; }
     bool HasStarted() const { return dragStarted_; }
-    TopLevelWindow* GetTargetWindow() const { return targetWindow_; }
-    WorkspaceFrame* GetTargetFrame() const { return targetFrame_; }
+    TopLevelWindow* GetTargetWindow() const { return targetWindow_.get(); }
+    WorkspaceFrame* GetTargetFrame() const { return targetFrame_.get(); }
     TopLevelWindow* GetDragWindow() const { return dragWindow_.get(); }
     DropZone::DropType GetCurrentDropType() const { return currentDropType_; }
     RectT GetDragRect() const { return dragRect_; }
@@ -72,11 +73,12 @@ private:
     PointT lastPoint_;
     RectT dragRect_;
     boost::intrusive_ptr<WorkspaceFrame> sourceFrame_;
-    TopLevelWindow* targetWindow_ = nullptr;
-    WorkspaceFrame* targetFrame_ = nullptr;
+    // Held, not just pointed at: a window or frame may go away while the pointer is over it.
+    boost::intrusive_ptr<TopLevelWindow> targetWindow_;
+    boost::intrusive_ptr<WorkspaceFrame> targetFrame_;
     int applyingCount_ = 0;
     DropZone::DropType currentDropType_ = DropZone::TabWell;
-    WorkspaceFrame* appliedFrame_;
+    boost::intrusive_ptr<WorkspaceFrame> appliedFrame_;
     DropZone::DropType appliedDropType_ = DropZone::TabWell;
     unsigned long tabIndex_;
     bool wholeFrame_;
@@ -85,6 +87,9 @@ private:
     bool needTabRects_ = true;
     std::vector<RectT> sourceTabRects_;
     boost::intrusive_ptr<TopLevelWindow> dragWindow_;
+    // A panel docked somewhere other than a tabbed frame (a window's tool bar): focused at the end.
+    boost::intrusive_ptr<TabPanel> dockedElsewhere_;
+    int trackingDepth_ = 0;
     bool ended_ = false;
 };
 

@@ -884,7 +884,7 @@ bool TopLevelWindow::UI_DoKeyboardEvent(KeyboardEvent& event) {
     if (workspace_) {
         if (OS_Tracker* tracker = workspace_->GetTracker(); tracker && tracker->WantsKeyEvents()) {
             tracker->DoKeyEvent(event);
-            if (tracker->HasBeenCancelled()) {
+            if (workspace_->GetTracker() == tracker && tracker->HasBeenCancelled()) {
                 workspace_->ReleaseTracker(false);
             }
             return true;

@@ -27,8 +27,11 @@ void Tracker::Begin(PointT const& global, bool* endAtOnce) {
 }
 
 void Tracker::End() {
-    flags_.Clear(TrackingBit);
-    OS_Tracker::End();
+    // Only a tracker that began holds the capture; one that never began leaves it alone.
+    if (IsTracking()) {
+        flags_.Clear(TrackingBit);
+        OS_Tracker::End();
+    }
 }
 
 void Tracker::Cancel() {

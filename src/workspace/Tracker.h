@@ -32,6 +32,8 @@ public:
     void Begin(orvui::ui::PointT const& global, bool* endAtOnce) override;
     void End() override;
     void Cancel() override;
+    // Cancelled without the beep (the workspace is going away).
+    void Abandon() { flags_.Set(CancelledBit); }
     bool HasBeenCancelled() const override { return flags_.IsSet(CancelledBit); }
     bool IsTracking() const { return flags_.IsSet(TrackingBit); }
     Workspace* GetWorkspace() const { return workspace_; }

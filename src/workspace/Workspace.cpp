@@ -38,7 +38,12 @@ Workspace::Workspace(canvasor::SupplierInterface* supplier)
 Workspace::~Workspace() {
     InstallThemeChangedFunction(nullptr);
     UI_NodeManager::Get()->InstallUserResizeFunction(nullptr);
+    // A drag still running when the host goes away ends without docking anything.
+    if (auto* tracker = dynamic_cast<Tracker*>(tracker_.get())) {
+        tracker->Abandon();
+    }
     tracker_.reset();
+    retiredTrackers_.clear();
     tabCreators_.clear();
     Theme::Terminate();
     DeleteChildren();
@@ -128,11 +133,26 @@ void Workspace::ReleaseTracker(bool cancel) {
     if (ending && cancel) {
         ending->Cancel();
     }
+    if (ending && ending->IsBusy()) {
+        // Released from inside its own step: it ends now and is destroyed once that step is over.
+        ending->End();
+        retiredTrackers_.push_back(std::move(ending));
+        return;
+    }
     ending.reset();
+    DestroyIdleRetiredTrackers();
+}
+
+void Workspace::DestroyIdleRetiredTrackers() {
+    retiredTrackers_.erase(std::remove_if(retiredTrackers_.begin(), retiredTrackers_.end(),
+                                          [](auto const& t) { return !t->IsBusy(); }),
+                           retiredTrackers_.end());
 }
 
 Tracker* Workspace::AcquireSplitterDragger(TopLevelWindow* window, PointT const& point) {
-    if (!window) {
+    // The previous drag ends before the next one looks at the layout it may change.
+    ReleaseTracker(false);
+    if (!window || !window->GetLayoutManager()) {
         return nullptr;
     }
     auto dragger = std::make_unique<SplitterDragger>(this, window, point);
@@ -140,16 +160,16 @@ Tracker* Workspace::AcquireSplitterDragger(TopLevelWindow* window, PointT const&
         return nullptr;
     }
     SplitterDragger* raw = dragger.get();
-    tracker_.reset(); // the previous drag ends before the next one starts
     tracker_ = std::move(dragger);
     return raw;
 }
 
 Tracker* Workspace::AcquireTabDragger(WorkspaceFrame* sourceFrame, bool wholeFrame, unsigned long tabIndex) {
+    boost::intrusive_ptr<WorkspaceFrame> keep(sourceFrame);
+    ReleaseTracker(false);
     if (!sourceFrame || !sourceFrame->GetTopLevelWindow() || long(tabIndex) >= sourceFrame->GetTabCount()) {
         return nullptr;
     }
-    tracker_.reset();
     auto dragger = std::make_unique<TabDragger>(this, sourceFrame, wholeFrame, tabIndex);
     TabDragger* raw = dragger.get();
     tracker_ = std::move(dragger);

@@ -200,6 +200,9 @@ private:
     void ForEachWindowWithLayoutOff(std::function<void(TopLevelWindow&)> const& action);
 
     std::unique_ptr<OS_Tracker> tracker_;
+    // Trackers released from inside one of their own steps; destroyed once nothing runs in them.
+    std::vector<std::unique_ptr<OS_Tracker>> retiredTrackers_;
+    void DestroyIdleRetiredTrackers();
     unsigned long freshTabTimeStamp_ = 0;
     unsigned long nextUniqueID_ = 0;
     long createTabPanelAssertionCount_ = 0;

@@ -493,7 +493,7 @@ TEST_F(Dragging, ABarTornOffByItsGripperFollowsThePointerAndStaysWhereDropped) {
     ASSERT_NE(Dragger(), nullptr);
     TopLevelWindow* floating = Dragger()->GetDragWindow();
     ASSERT_NE(floating, nullptr);
-    EXPECT_EQ(Desktop::Get().GetCapture(), floating->GetPlatformWindow());
+    EXPECT_EQ(Desktop::Get().GetCapture(), main->GetPlatformWindow());
     RectT outer = main->UI_GetGlobalStructureRect();
     PointT away(outer.Right() + 200, outer.top + 300);
     MoveTo(PointT(away.x - 20, away.y));
@@ -667,4 +667,64 @@ TEST_F(Dragging, AnOverlayWithoutANativeWindowIgnoresShowOpacityAndRepaints) {
     backed->UI_SetOpacity(0.3f);
     EXPECT_FLOAT_EQ(Desktop::Get().Record(backed->GetPlatformWindow())->opacity, 0.3f);
     EXPECT_EQ(backed->UI_GetNodeID(), "OverlayWindow");
+}
+
+TEST_F(Dragging, ABarTornOffOverAnEmptyMainWindowDocksThereAndTheDragStillEnds) {
+    boost::intrusive_ptr<TabPanel> bar(new ToolBar(workspace.get(), true));
+    main->SetStaticElement(bar, LayoutManager::Bottom, true);
+    workspace->RemoveTab(left, 0L, false, false);
+    workspace->RemoveTab(right, 0L, false, false);
+    workspace->RemoveTab(right, 0L, false, false);
+    ASSERT_EQ(main->GetRootFrame(), nullptr);
+    auto* holder = dynamic_cast<TablessWorkspaceFrame*>(bar->GetFrame());
+    ASSERT_NE(holder, nullptr);
+    PointT grip = Middle(holder->GetDragger()->UI_GetGlobalRect());
+    Press(grip);
+    PointT inside = Middle(main->UI_GetGlobalClientRect());
+    MoveTo(inside); // over the empty main window: the bar becomes its content at once
+    ASSERT_NE(main->GetRootFrame(), nullptr);
+    EXPECT_EQ(main->GetRootFrame()->GetFrontTabPanel(), bar.get());
+    EXPECT_EQ(workspace->GetWindows().size(), 1u);
+    MoveTo(PointT(inside.x + 20, inside.y));
+    Release(PointT(inside.x + 20, inside.y));
+    EXPECT_EQ(workspace->GetTracker(), nullptr);
+    EXPECT_EQ(Desktop::Get().GetCapture(), 0u);
+    EXPECT_EQ(workspace->GetFocusedTabPanel(), bar.get());
+}
+
+TEST_F(Dragging, APanelThatEndsTheDragWhileItDocksDoesNotPullItFromUnderItself) {
+    // A panel that ends the running drag the moment it is shown in its new place.
+    class Impatient : public PaintedPanel {
+    public:
+        explicit Impatient(Workspace* ws)
+            : PaintedPanel(ws, nullptr, "mixer", MixerPaint, nullptr) {}
+        void UI_Show(bool show) override {
+            PaintedPanel::UI_Show(show);
+            if (show && armed && GetWorkspace()->GetTracker()) {
+                armed = false;
+                GetWorkspace()->ReleaseTracker(false);
+            }
+        }
+        bool armed = false;
+    };
+    RectT start(1200, 200, 300, 250);
+    auto floating = workspace->AddTopLevelWindow(false, &start);
+    floating->UI_Show(true);
+    WorkspaceFrame* frame = floating->CreateRootFrame("editor", true, true);
+    boost::intrusive_ptr<Impatient> moved(new Impatient(workspace.get()));
+    frame->AddTab(moved, true);
+    workspace->RemoveTab(left, 0L, false, false);
+    workspace->RemoveTab(right, 0L, false, false);
+    workspace->RemoveTab(right, 0L, false, false);
+    ASSERT_EQ(main->GetRootFrame(), nullptr);
+    Press(OnTab(frame, 1));
+    moved->armed = true;
+    MoveTo(Middle(main->UI_GetGlobalClientRect())); // docks into the empty main window, showing it
+    EXPECT_FALSE(moved->armed);
+    EXPECT_EQ(workspace->GetTracker(), nullptr);
+    ASSERT_NE(main->GetRootFrame(), nullptr);
+    EXPECT_EQ(main->GetRootFrame()->GetFrontTabPanel(), moved.get());
+    MoveTo(PointT(10, 10)); // nothing follows any more
+    EXPECT_EQ(main->GetRootFrame()->GetFrontTabPanel(), moved.get());
+    Release(PointT(10, 10));
 }
