@@ -1,0 +1,262 @@
+// The workspace manager's stories on a temporary preferences folder: first start with and without
+// built-in workspaces, the settings cache, switching, creating, saving, deleting, resetting.
+#include "workspace/WorkspaceDoubles.h"
+
+#include "host/core/Dir.h"
+#include "host/core/Error.h"
+#include "host/core/FileUtils.h"
+#include "host/core/PropListUtils.h"
+#include "manager/Manager.h"
+#include "manager/WorkspaceDirs.h"
+#include "persistence/WorkspaceBuilder.h"
+#include "persistence/WorkspaceDocument.h"
+#include "support/TempDir.h"
+
+#include <cstdlib>
+#include <filesystem>
+
+using namespace orvtest;
+using orvcore::proplist::PropList;
+using orvcore::utility::FileUtils;
+
+namespace {
+
+// Two built-in workspaces: "Editing" (editor | browser) and "Mixing" (a mixer alone).
+class BuiltIns : public BuiltInWorkspaceProviderBase {
+public:
+    void GetWorkspaces(std::vector<std::u16string>& out) const override {
+        out.insert(out.end(), names.begin(), names.end());
+    }
+    std::unique_ptr<WorkspaceBuilder> CreateWorkspaceBuilder(std::u16string const& name,
+                                                             Workspace& ws) const override {
+        ++builds;
+        auto builder = std::make_unique<WorkspaceBuilder>(ws, true, false);
+        RectT rect(100, 80, 1000, 700);
+        if (name == u"Editing") {
+            builder->AddWindow(std::make_unique<SplitterBuilder>(true,
+                                                                 std::make_unique<FrameBuilder>("editor"),
+                                                                 std::make_unique<FrameBuilder>("browser")),
+                               rect, "");
+        } else if (name == u"Mixing") {
+            builder->AddWindow(std::make_unique<FrameBuilder>("mixer"), rect, "");
+        } else {
+            return nullptr;
+        }
+        return builder;
+    }
+    std::vector<std::u16string> names{u"Editing", u"Mixing"};
+    mutable int builds = 0;
+};
+
+class ManagerStories : public WorkspaceTest {
+protected:
+    void SetUp() override {
+        setenv("ORV_PREFS_DIR", prefs.Path().string().c_str(), 1);
+        WorkspaceTest::SetUp();
+        orvworkspace::workspaceutils::GetWorkspaceDirs(nullptr, saved, archived, settings);
+    }
+    void TearDown() override {
+        manager.reset();
+        WorkspaceTest::TearDown();
+        unsetenv("ORV_PREFS_DIR");
+    }
+    Manager& Start(BuiltInWorkspaceProviderBase* builtIn = nullptr) {
+        manager = std::make_unique<Manager>(*workspace, saved, archived, settings, builtIn, false);
+        manager->Initialize();
+        return *manager;
+    }
+    void Restart(BuiltInWorkspaceProviderBase* builtIn = nullptr) {
+        manager.reset();
+        Start(builtIn);
+    }
+    std::vector<std::u16string> Names() const {
+        std::vector<std::u16string> names;
+        manager->GetWorkspaces(names);
+        return names;
+    }
+    std::vector<std::u16string> FilesIn(std::u16string const& folder) const {
+        std::vector<std::u16string> files;
+        FileUtils::ContainedFiles(folder, files);
+        return files;
+    }
+    std::vector<std::string> FrameTypes() const {
+        std::vector<std::string> types;
+        for (unsigned long f = 0; f < main->GetFrameCount(); ++f) {
+            types.push_back(main->GetFrame(f)->GetFrontTabPanel()->GetTabType());
+        }
+        return types;
+    }
+
+    TempDir prefs;
+    std::u16string saved, archived, settings;
+    std::unique_ptr<Manager> manager;
+};
+
+} // namespace
+
+TEST_F(ManagerStories, TheFoldersLiveInThePreferencesFolder) {
+    EXPECT_TRUE(FileUtils::DirectoryExists(saved));
+    EXPECT_TRUE(FileUtils::DirectoryExists(archived));
+    EXPECT_EQ(saved, prefs.U16("SavedWorkspaces"));
+    EXPECT_EQ(archived, prefs.U16("ArchivedWorkspaces"));
+    EXPECT_EQ(settings, prefs.U16("WSMgrCfg"));
+    EXPECT_FALSE(FileUtils::FileExists(settings));
+}
+
+TEST_F(ManagerStories, AFirstStartListsTheBuiltInsAndWritesTheSettings) {
+    BuiltIns builtIns;
+    Start(&builtIns);
+    EXPECT_EQ(Names(), (std::vector<std::u16string>{u"Editing", u"Mixing"}));
+    EXPECT_EQ(manager->GetWorkspaceTable().at(u"Editing"), nullptr); // placeholders
+    ASSERT_TRUE(FileUtils::FileExists(settings));
+    PropList doc;
+    orvcore::proplist::utils::LoadPropList(settings, doc, true);
+    std::vector<std::u16string> listed;
+    doc.GetValue("BuiltIns", listed);
+    EXPECT_EQ(listed, (std::vector<std::u16string>{u"Editing", u"Mixing"}));
+    EXPECT_FALSE(doc.HasKey("WorkspaceConfigVersion")); // records come with a flush only
+
+    // Without a provider nothing is listed and nothing written; a flush without a document writes none.
+    std::filesystem::remove(prefs.Path() / "WSMgrCfg");
+    Restart(nullptr);
+    EXPECT_TRUE(Names().empty());
+    manager->FlushManagerSettings();
+    EXPECT_FALSE(FileUtils::FileExists(settings));
+    EXPECT_THROW(manager->Initialize(), orvcore::config::Error);
+}
+
+TEST_F(ManagerStories, SelectingABuiltInWritesAUserFileThatTheNextSelectionLoads) {
+    BuiltIns builtIns;
+    Start(&builtIns);
+    ASSERT_TRUE(manager->SetCurrentWorkspace(u"Editing"));
+    EXPECT_EQ(builtIns.builds, 1);
+    EXPECT_EQ(FrameTypes(), (std::vector<std::string>{"editor", "browser"}));
+    ASSERT_NE(manager->GetWorkspaceTable().at(u"Editing"), nullptr);
+    EXPECT_EQ(FilesIn(saved), std::vector<std::u16string>{prefs.U16("SavedWorkspaces/UserWorkspace1.xml")});
+    EXPECT_TRUE(manager->SetCurrentWorkspace(u"Editing")); // already current
+    main->GetFrame(0)->AddTab("mixer", true);              // the user changes it
+
+    ASSERT_TRUE(manager->SetCurrentWorkspace(u"Mixing"));
+    EXPECT_EQ(FrameTypes(), std::vector<std::string>{"mixer"});
+    ASSERT_TRUE(manager->SetCurrentWorkspace(u"Editing")); // loaded from its file, with the change
+    EXPECT_EQ(builtIns.builds, 2);
+    EXPECT_EQ(main->GetFrame(0)->GetTabCount(), 2);
+    EXPECT_FALSE(manager->SetCurrentWorkspace(u"Nobody"));
+    EXPECT_EQ(manager->GetCurrentWorkspace(), u"Editing");
+}
+
+TEST_F(ManagerStories, TheSettingsCacheSparesReadingFilesThatDidNotChange) {
+    BuiltIns builtIns;
+    Start(&builtIns);
+    manager->CreateUserWorkspace(u"Mine");
+    manager->CreateUserWorkspace(u"Other");
+    manager->FlushManagerSettings();
+    Restart(&builtIns);
+    EXPECT_EQ(manager->GetFilesRead(), 0u);
+    EXPECT_EQ(manager->GetKnownFiles().size(), 4u); // two user files, two archives
+    EXPECT_EQ(Names(), (std::vector<std::u16string>{u"Editing", u"Mine", u"Mixing", u"Other"}));
+
+    // A file changed after the flush is read again; a deleted one is dropped.
+    std::u16string mine = manager->GetWorkspaceTable().at(u"Mine")->GetFilePath();
+    std::u16string other = manager->GetWorkspaceTable().at(u"Other")->GetFilePath();
+    std::filesystem::last_write_time(std::filesystem::path(orvcore::filesupport::ToPath(mine)),
+                                     std::filesystem::file_time_type::clock::now() + std::chrono::seconds(5));
+    std::filesystem::remove(orvcore::filesupport::ToPath(other));
+    Restart(&builtIns);
+    EXPECT_EQ(manager->GetFilesRead(), 1u);
+    EXPECT_EQ(Names(), (std::vector<std::u16string>{u"Editing", u"Mine", u"Mixing"}));
+
+    // Records of another version, or lists of unequal length, are no records: every file is read.
+    PropList doc;
+    orvcore::proplist::utils::LoadPropList(settings, doc, true);
+    doc.SetValue("WorkspaceConfigVersion", std::string("1.0"));
+    orvcore::proplist::utils::SavePropList(settings, doc);
+    Restart(&builtIns);
+    EXPECT_EQ(manager->GetFilesRead(), 3u); // Mine, and both archives
+    manager->FlushManagerSettings();
+    orvcore::proplist::utils::LoadPropList(settings, doc, true);
+    doc.SetValue("UserNames", std::vector<std::u16string>{u"Mine"});
+    orvcore::proplist::utils::SavePropList(settings, doc);
+    Restart(&builtIns);
+    EXPECT_EQ(manager->GetFilesRead(), 3u);
+}
+
+TEST_F(ManagerStories, TwoFilesOfOneNameGiveOneWorkspaceAndForeignFilesAreSkipped) {
+    Start(nullptr);
+    manager->CreateUserWorkspace(u"Twin");
+    std::u16string first = manager->GetWorkspaceTable().at(u"Twin")->GetFilePath();
+    FileUtils::Copy(first, prefs.U16("SavedWorkspaces/Copy.xml"));
+    prefs.Write("SavedWorkspaces/broken.xml", "<prop.list><key>");
+    prefs.Write("SavedWorkspaces/notes.txt", "hello");
+    prefs.Write("SavedWorkspaces/empty.xml", "");
+    Restart(nullptr);
+    EXPECT_EQ(Names(), std::vector<std::u16string>{u"Twin"});
+    // The last file read under a name wins (files are read in name order).
+    EXPECT_EQ(manager->GetWorkspaceTable().at(u"Twin")->GetFilePath(), first);
+}
+
+TEST_F(ManagerStories, DeletingABuiltInLastsUntilTheManagerIsReset) {
+    BuiltIns builtIns;
+    Start(&builtIns);
+    manager->SetCurrentWorkspace(u"Mixing");
+    manager->DeleteUserWorkspace(u"Editing"); // never selected: a placeholder
+    manager->DeleteUserWorkspace(u"Mixing");  // the current one, with its file
+    EXPECT_FALSE(manager->HasCurrentWorkspace());
+    EXPECT_TRUE(FilesIn(saved).empty());
+    EXPECT_THROW(manager->DeleteUserWorkspace(u"Nobody"), orvcore::config::Error);
+    Restart(&builtIns);
+    EXPECT_TRUE(Names().empty());
+    manager->ResetWorkspaceMgr();
+    EXPECT_EQ(Names(), (std::vector<std::u16string>{u"Editing", u"Mixing"}));
+}
+
+TEST_F(ManagerStories, ACreatedWorkspaceRevertsToItsFirstLayout) {
+    BuildTwoFrames();
+    Start(nullptr);
+    manager->CreateUserWorkspace(u"Mine");
+    EXPECT_EQ(FilesIn(archived).size(), 1u);
+    EXPECT_THROW(manager->CreateUserWorkspace(u"Mine"), orvcore::config::Error);
+    left->AddTab("mixer", true);
+    ASSERT_TRUE(manager->SaveWorkspace(u"Mine"));
+    manager->RevertWorkspace(u"Mine");
+    EXPECT_EQ(FrameTypes(), (std::vector<std::string>{"editor", "browser"}));
+    EXPECT_EQ(main->GetFrame(0)->GetTabCount(), 1);
+    EXPECT_FALSE(manager->SaveWorkspace(u"Nobody"));
+
+    // Adding under an existing name without replacing changes nothing.
+    PropList document;
+    SaveWorkspace(*workspace, document, u"");
+    EXPECT_FALSE(manager->AddWorkspace(u"Mine", document, false));
+    EXPECT_TRUE(manager->AddWorkspace(u"Project", document, false));
+    EXPECT_EQ(manager->GetCurrentWorkspace(), u"Project");
+}
+
+TEST_F(ManagerStories, NamesSortForAMenuFilledFromTheTop) {
+    Start(nullptr);
+    for (char16_t const* name : {u"beta", u"Alpha", u"alpha2"}) {
+        manager->CreateUserWorkspace(name);
+    }
+    std::vector<std::u16string> sorted;
+    manager->GetUISortedWorkspaceNames(sorted);
+    EXPECT_EQ(sorted, (std::vector<std::u16string>{u"beta", u"alpha2", u"Alpha"}));
+}
+
+TEST_F(ManagerStories, AFailedWriteKeepsThePreviousFileWhole) {
+    Start(nullptr);
+    BuildTwoFrames();
+    manager->CreateUserWorkspace(u"Mine");
+    std::u16string path = manager->GetWorkspaceTable().at(u"Mine")->GetFilePath();
+    std::string before = FileUtils::ReadWholeFile(path, 1 << 20);
+    left->AddTab("mixer", true);
+    // A folder that cannot be written: the temporary file cannot be made beside the old one.
+    std::filesystem::permissions(prefs.Path() / "SavedWorkspaces", std::filesystem::perms::owner_write,
+                                 std::filesystem::perm_options::remove);
+    bool written = manager->SaveWorkspace(u"Mine");
+    std::filesystem::permissions(prefs.Path() / "SavedWorkspaces", std::filesystem::perms::owner_write,
+                                 std::filesystem::perm_options::add);
+    if (::geteuid() == 0) {
+        GTEST_SKIP() << "permissions do not stop the superuser";
+    }
+    EXPECT_FALSE(written);
+    EXPECT_EQ(FileUtils::ReadWholeFile(path, 1 << 20), before);
+}
