@@ -260,3 +260,99 @@ TEST_F(ManagerStories, AFailedWriteKeepsThePreviousFileWhole) {
     EXPECT_FALSE(written);
     EXPECT_EQ(FileUtils::ReadWholeFile(path, 1 << 20), before);
 }
+
+namespace {
+
+class ShippedWorkspaces : public SystemWorkspaceProviderBase {
+public:
+    explicit ShippedWorkspaces(std::u16string f)
+        : folder(std::move(f)) {}
+    void GetSystemWorkspaceFolder(std::u16string& out) const override { out = folder; }
+    std::u16string folder;
+};
+
+class LocalizedBuiltIns : public BuiltIns {
+public:
+    LocalizedBuiltIns() { names = {u"Editing"}; }
+    bool SupportsLocalizedWorkspaceNames() const override { return true; }
+    void GetWorkspaceStringKeys(std::list<std::string>& out) const override {
+        out.push_back("$$$/Test/Workspace/Editing=Editing");
+    }
+};
+
+class CountingHelper : public MenuHelperBase {
+public:
+    void RebuildMenu() override { log.push_back(u"rebuild"); }
+    void NewActiveWorkspace(std::u16string const& name) override { log.push_back(u"current " + name); }
+    std::vector<std::u16string> log;
+};
+
+} // namespace
+
+TEST_F(ManagerStories, ASystemWorkspaceIsCopiedOnceAndResetsToItsShippedFile) {
+    TempDir shipped;
+    BuildTwoFrames();
+    PropList document;
+    SaveWorkspace(*workspace, document, u"Colour");
+    orvcore::proplist::utils::SavePropList(shipped.U16("Colour.xml"), document);
+    ShippedWorkspaces system(shipped.U16());
+    manager = std::make_unique<Manager>(*workspace, saved, archived, settings, nullptr, &system, false);
+    manager->Initialize();
+    EXPECT_EQ(Names(), std::vector<std::u16string>{u"Colour"});
+    EXPECT_TRUE(system.FindWorkspace(u"Colour"));
+    EXPECT_EQ(manager->GetWorkspaceTable().at(u"Colour"), nullptr);
+
+    workspace->RemoveTab(left, 0L, false, false);
+    ASSERT_TRUE(manager->SetCurrentWorkspace(u"Colour"));
+    EXPECT_EQ(FrameTypes(), (std::vector<std::string>{"editor", "browser"}));
+    std::u16string copy = prefs.U16("SavedWorkspaces/Colour.xml");
+    EXPECT_EQ(manager->GetWorkspaceTable().at(u"Colour")->GetFilePath(), copy);
+    main->GetFrame(0)->AddTab("mixer", true);
+    ASSERT_TRUE(manager->SaveWorkspace(u"Colour"));
+    std::string shippedBytes = FileUtils::ReadWholeFile(shipped.U16("Colour.xml"), 1 << 20);
+    EXPECT_NE(FileUtils::ReadWholeFile(copy, 1 << 20),
+              shippedBytes); // the user's copy changed, not the shipped file
+    manager->RevertWorkspace(u"Colour");
+    EXPECT_EQ(main->GetFrame(0)->GetTabCount(), 1);
+    // Chosen again after a restart, the user's copy is used as it is.
+    manager.reset();
+    manager = std::make_unique<Manager>(*workspace, saved, archived, settings, nullptr, &system, false);
+    manager->Initialize();
+    ASSERT_TRUE(manager->SetCurrentWorkspace(u"Colour"));
+    EXPECT_EQ(main->GetFrame(0)->GetTabCount(), 2);
+}
+
+TEST_F(ManagerStories, LocalizedNamesAreSavedUnderTheirKeyAndReadBackAsText) {
+    LocalizedBuiltIns builtIns;
+    Start(&builtIns);
+    EXPECT_EQ(Names(), std::vector<std::u16string>{u"Editing"});
+    PropList doc;
+    orvcore::proplist::utils::LoadPropList(settings, doc, true);
+    std::vector<std::string> keys;
+    doc.GetValue("BuiltInKeys", keys);
+    EXPECT_EQ(keys, std::vector<std::string>{"$$$/Test/Workspace/Editing=Editing"});
+    ASSERT_TRUE(manager->SetCurrentWorkspace(u"Editing"));
+    PropList file;
+    orvcore::proplist::utils::LoadPropList(manager->GetWorkspaceTable().at(u"Editing")->GetFilePath(), file,
+                                           true);
+    EXPECT_EQ(GetWorkspaceUserName(file), u"$$$/Test/Workspace/Editing=Editing");
+    Restart(&builtIns);
+    EXPECT_EQ(Names(), std::vector<std::u16string>{u"Editing"});
+    ASSERT_NE(manager->GetWorkspaceTable().at(u"Editing"), nullptr); // the file, found under its text
+}
+
+TEST_F(ManagerStories, HelpersHearOfNewListsAndNewCurrentWorkspaces) {
+    BuiltIns builtIns;
+    Start(&builtIns);
+    CountingHelper helper;
+    manager->AddMenuHelper(&helper);
+    manager->SetCurrentWorkspace(u"Mixing");
+    manager->CreateUserWorkspace(u"Mine");
+    manager->DefaultingToProjectWorkspace();
+    EXPECT_EQ(helper.log, (std::vector<std::u16string>{u"rebuild", u"current Mixing", u"rebuild",
+                                                       u"current Mine", u"current "}));
+    EXPECT_FALSE(manager->CheckWorkspaceLoading());
+    manager->RemoveMenuHelper(&helper);
+    manager->SetCurrentWorkspace(u"Mine");
+    EXPECT_EQ(helper.log.size(), 5u);
+}
