@@ -72,8 +72,10 @@ void ManagerBase::Initialize() {
     if (initialized_) {
         ThrowError(orvcore::config::errors::WorkspaceManagerAlreadyInitialized);
     }
-    ReadSettingsCache();
-    AddBuiltInPlaceholders();
+    PropList settings;
+    bool haveSettings = LoadManagerSettings(settings);
+    ReadSettingsCache(settings, haveSettings);
+    AddBuiltInPlaceholders(std::move(settings), haveSettings);
     PopulateSystemWorkspaces(workspaces_, systems_);
     PopulateUserWorkspaces(workspaces_, archives_);
     initialized_ = true;
@@ -91,9 +93,8 @@ void ManagerBase::AddEntry(Table& table, std::u16string const& path, std::u16str
     table[name] = std::make_unique<ManagerEntryImplData>(path, nameKey);
 }
 
-void ManagerBase::ReadSettingsCache() {
-    PropList settings;
-    if (!LoadManagerSettings(settings)) {
+void ManagerBase::ReadSettingsCache(PropList const& settings, bool haveSettings) {
+    if (!haveSettings) {
         return;
     }
     std::string version;
@@ -112,8 +113,9 @@ void ManagerBase::ReadSettingsCache() {
         return; // records that do not line up are no records
     }
     for (std::size_t i = 0; i < times.size(); ++i) {
-        orvcore::filesupport::File file(paths[i]);
-        if (!file.Exists() || orvcore::utility::ToIsoString(file.Modified()) != times[i]) {
+        // One look at the file: a missing one has no time.
+        boost::posix_time::ptime modified = orvcore::filesupport::File(paths[i]).Modified();
+        if (modified.is_special() || orvcore::utility::ToIsoString(modified) != times[i]) {
             continue; // changed or gone: the folder scans find it again
         }
         knownFiles_.insert(paths[i]);
@@ -133,10 +135,8 @@ void ManagerBase::ReadSettingsCache() {
     }
 }
 
-void ManagerBase::AddBuiltInPlaceholders() {
+void ManagerBase::AddBuiltInPlaceholders(PropList settings, bool haveSettings) {
     bool localized = builtIn_ && builtIn_->SupportsLocalizedWorkspaceNames();
-    PropList settings;
-    bool haveSettings = LoadManagerSettings(settings);
     if (haveSettings) {
         std::vector<std::u16string> names;
         bool listed = false;

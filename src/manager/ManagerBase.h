@@ -101,8 +101,9 @@ protected:
 
 private:
     void CheckInitialized() const;
-    void ReadSettingsCache();
-    void AddBuiltInPlaceholders();
+    // Both read the settings document Initialize loaded once (haveSettings: there was one).
+    void ReadSettingsCache(orvcore::proplist::PropList const& settings, bool haveSettings);
+    void AddBuiltInPlaceholders(orvcore::proplist::PropList settings, bool haveSettings);
     bool IsBuiltIn(std::u16string const& name) const;
     // Lays a built-in workspace out from its builder; false when the provider has none.
     bool LayOutBuiltIn(std::u16string const& name);

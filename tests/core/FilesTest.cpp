@@ -8,6 +8,8 @@
 #include "support/FileSizeLimit.h"
 #include "support/TempDir.h"
 
+#include <boost/date_time/posix_time/time_formatters.hpp>
+
 #include <cstdlib>
 #include <fcntl.h>
 #include <gtest/gtest.h>
@@ -109,6 +111,13 @@ TEST(FileUtils, ModificationTimeAsIsoText) {
     SetModified(p, 1767323045, 0);
     EXPECT_EQ(ToIsoString(File(TempDir::PathU16(p)).Modified()), "20260102T030405");
     EXPECT_EQ(ToIsoString(File(tmp.U16("absent")).Modified()), "not-a-date-time");
+    // Small fractions keep their leading zeros, and the text is the library's with a comma.
+    SetModified(p, 946684799, 5000); // 1999-12-31 23:59:59.000005
+    EXPECT_EQ(ToIsoString(File(TempDir::PathU16(p)).Modified()), "19991231T235959,000005");
+    boost::posix_time::ptime t = File(TempDir::PathU16(p)).Modified();
+    std::string library = boost::posix_time::to_iso_string(t);
+    library[library.find('.')] = ',';
+    EXPECT_EQ(ToIsoString(t), library);
 }
 
 TEST(FileUtils, UniqueFileNameSkipsTakenNamesAndCreateNewFileRefusesThem) {
