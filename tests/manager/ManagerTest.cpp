@@ -6,7 +6,9 @@
 #include "host/core/Error.h"
 #include "host/core/FileUtils.h"
 #include "host/core/PropListUtils.h"
+#include "host/ui/Menu.h"
 #include "manager/Manager.h"
+#include "manager/PlatformMenuHelperBase.h"
 #include "manager/WorkspaceDirs.h"
 #include "persistence/WorkspaceBuilder.h"
 #include "persistence/WorkspaceDocument.h"
@@ -355,4 +357,107 @@ TEST_F(ManagerStories, HelpersHearOfNewListsAndNewCurrentWorkspaces) {
     manager->RemoveMenuHelper(&helper);
     manager->SetCurrentWorkspace(u"Mine");
     EXPECT_EQ(helper.log.size(), 5u);
+}
+
+// --- Menu helpers ---
+
+namespace {
+
+std::vector<std::u16string> MenuTexts(orvui::utility::OS_Menu const& menu) {
+    std::vector<std::u16string> texts;
+    for (auto const& item : menu.Items()) {
+        texts.push_back(item.separator ? u"--" : item.text);
+    }
+    return texts;
+}
+
+} // namespace
+
+TEST_F(ManagerStories, AMenuListsTheWorkspacesAboveTheHostsItemsAndChecksTheCurrentOne) {
+    Start(nullptr);
+    for (char16_t const* name : {u"b", u"a", u"C"}) {
+        manager->CreateUserWorkspace(name);
+    }
+    orvui::utility::OS_Menu menu;
+    for (char16_t const* item : {u"New", u"Delete", u"Reset"}) {
+        menu.AppendItem(item, 1);
+    }
+    auto helper = PlatformMenuHelperBase::NewPlatformMenuHelper(&menu, *manager, {500, 10}, false);
+    EXPECT_EQ(helper->GetInitialMenuItemCount(), 3u);
+    manager->AddMenuHelper(helper.get());
+    std::vector<std::u16string> expected{u"a", u"b", u"C", u"--", u"New", u"Delete", u"Reset"};
+    EXPECT_EQ(MenuTexts(menu), expected);
+    EXPECT_EQ(menu.GetItem(0).command, 500u);
+    EXPECT_TRUE(menu.IsChecked(502)); // C, the last one created, is current
+    EXPECT_FALSE(IsCommandCheckStyleRadio(500));
+    helper->RebuildMenu();
+    EXPECT_EQ(MenuTexts(menu), expected);
+
+    // Picking a command switches; a command that is none of ours is left to the host.
+    EXPECT_TRUE(helper->HandleCommand(500));
+    EXPECT_EQ(manager->GetCurrentWorkspace(), u"a");
+    EXPECT_TRUE(menu.IsChecked(500));
+    EXPECT_FALSE(menu.IsChecked(502));
+    EXPECT_FALSE(helper->HandleCommand(1));
+    EXPECT_EQ(manager->GetCurrentWorkspace(), u"a");
+    manager->DefaultingToProjectWorkspace();
+    EXPECT_EQ(helper->GetCheckedCommand(), 0u);
+
+    // Everything gone: only the host's items, no separator.
+    for (char16_t const* name : {u"a", u"b", u"C"}) {
+        manager->DeleteUserWorkspace(name);
+    }
+    EXPECT_EQ(MenuTexts(menu), (std::vector<std::u16string>{u"New", u"Delete", u"Reset"}));
+    manager->RemoveMenuHelper(helper.get());
+}
+
+TEST_F(ManagerStories, CommandIdsComeFromARangeOrAnAllocatorAskedOnlyForWhatIsMissing) {
+    Start(nullptr);
+    for (char16_t const* name : {u"a", u"b", u"c"}) {
+        manager->CreateUserWorkspace(name);
+    }
+    auto ranged = PlatformMenuHelperBase::NewPlatformMenuHelper(nullptr, *manager, {1000, 2}, false);
+    ranged->RebuildMenu();
+    // Two IDs for three names: the last two in ascending order get them, and nothing is checked.
+    EXPECT_EQ(MenuTexts(*ranged->GetMenu()), (std::vector<std::u16string>{u"b", u"c", u"--"}));
+    EXPECT_EQ(ranged->GetMenu()->GetItem(0).command, 1000u);
+    EXPECT_EQ(ranged->GetCheckedCommand(), 0u);
+
+    std::vector<unsigned long> asked;
+    unsigned long next = 7000;
+    PlatformMenuHelperBase::IdAllocator allocator =
+        std::make_shared<std::function<unsigned long(unsigned long)>>([&](unsigned long count) {
+            asked.push_back(count);
+            unsigned long first = next;
+            next += count;
+            return first;
+        });
+    auto allocated = PlatformMenuHelperBase::NewPlatformMenuHelper(nullptr, *manager, allocator, false);
+    manager->AddMenuHelper(allocated.get());
+    manager->CreateUserWorkspace(u"d");
+    manager->DeleteUserWorkspace(u"a");
+    EXPECT_EQ(asked, (std::vector<unsigned long>{3, 1}));
+    manager->RemoveMenuHelper(allocated.get());
+
+    // A pool starting at 0: the command with ID 0 is never checked nor reported.
+    auto fromZero = PlatformMenuHelperBase::NewPlatformMenuHelper(nullptr, *manager, {0, 5}, false);
+    fromZero->RebuildMenu();
+    unsigned long command = 99;
+    EXPECT_FALSE(fromZero->WorkspaceCmdForName(u"b", command)); // b is first from the top: ID 0
+    EXPECT_EQ(command, 0u);
+    EXPECT_TRUE(fromZero->WorkspaceCmdForName(u"c", command));
+    EXPECT_EQ(command, 1u);
+}
+
+TEST_F(ManagerStories, LongNamesAreShortenedInTheMenuButKeptWholeForTheCommand) {
+    Start(nullptr);
+    std::u16string longName(150, u'x');
+    longName += u"end";
+    manager->CreateUserWorkspace(longName);
+    auto helper = PlatformMenuHelperBase::NewPlatformMenuHelper(nullptr, *manager, {10, 4}, false);
+    helper->RebuildMenu();
+    EXPECT_LE(helper->GetMenu()->GetItem(0).text.size(), 100u);
+    std::u16string whole;
+    ASSERT_TRUE(helper->WorkspaceNameForCmd(10, whole));
+    EXPECT_EQ(whole, longName);
 }
