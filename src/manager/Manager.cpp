@@ -84,7 +84,10 @@ std::unique_ptr<WorkspaceEntryImplData> Manager::DoCreateUserWorkspace(std::u16s
     if (path.empty()) {
         return nullptr;
     }
-    FileUtils::CreateNewFile(path);
+    // A workspace whose file cannot even be made is not made (the caller reports it).
+    if (!FileUtils::CreateNewFile(path) && !FileUtils::FileExists(path)) {
+        return nullptr;
+    }
     return std::make_unique<ManagerEntryImplData>(path, NameKeyFor(name));
 }
 

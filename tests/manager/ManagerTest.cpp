@@ -12,6 +12,7 @@
 #include "manager/WorkspaceDirs.h"
 #include "persistence/WorkspaceBuilder.h"
 #include "persistence/WorkspaceDocument.h"
+#include "support/FileSizeLimit.h"
 #include "support/TempDir.h"
 
 #include <cstdlib>
@@ -243,24 +244,32 @@ TEST_F(ManagerStories, NamesSortForAMenuFilledFromTheTop) {
     EXPECT_EQ(sorted, (std::vector<std::u16string>{u"beta", u"alpha2", u"Alpha"}));
 }
 
-TEST_F(ManagerStories, AFailedWriteKeepsThePreviousFileWhole) {
+TEST_F(ManagerStories, AFailedWriteKeepsThePreviousFileWholeAndIsNoSuccess) {
     Start(nullptr);
     BuildTwoFrames();
     manager->CreateUserWorkspace(u"Mine");
     std::u16string path = manager->GetWorkspaceTable().at(u"Mine")->GetFilePath();
     std::string before = FileUtils::ReadWholeFile(path, 1 << 20);
+    ASSERT_GT(before.size(), 200u);
     left->AddTab("mixer", true);
-    // A folder that cannot be written: the temporary file cannot be made beside the old one.
-    std::filesystem::permissions(prefs.Path() / "SavedWorkspaces", std::filesystem::perms::owner_write,
-                                 std::filesystem::perm_options::remove);
-    bool written = manager->SaveWorkspace(u"Mine");
-    std::filesystem::permissions(prefs.Path() / "SavedWorkspaces", std::filesystem::perms::owner_write,
-                                 std::filesystem::perm_options::add);
-    if (::geteuid() == 0) {
-        GTEST_SKIP() << "permissions do not stop the superuser";
-    }
+    // As on a disk that is full: no file may grow past 200 bytes.
+    bool written = true;
+    ASSERT_TRUE(WithFileSizeLimit(200, [&] { written = manager->SaveWorkspace(u"Mine"); }));
     EXPECT_FALSE(written);
     EXPECT_EQ(FileUtils::ReadWholeFile(path, 1 << 20), before);
+    // A switch away then a switch back loads the last layout that was written.
+    manager->CreateUserWorkspace(u"Other");
+    ASSERT_TRUE(manager->SetCurrentWorkspace(u"Mine"));
+    EXPECT_EQ(main->GetFrame(0)->GetTabCount(), 2); // saved on the way out, now that the disk has room
+}
+
+TEST_F(ManagerStories, ALoadThatFailsLeavesTheLoadingCounterAtRest) {
+    BuiltIns builtIns;
+    Start(&builtIns);
+    std::filesystem::remove_all(prefs.Path() / "SavedWorkspaces"); // no user file can be made
+    EXPECT_THROW(manager->SetCurrentWorkspace(u"Editing"), orvcore::config::Error);
+    EXPECT_FALSE(manager->CheckWorkspaceLoading());
+    EXPECT_FALSE(manager->HasCurrentWorkspace());
 }
 
 namespace {
