@@ -25,21 +25,21 @@ using filesupport::ToPath;
 bool FileUtils::ContainedFiles(std::u16string const& folder, std::vector<std::u16string>& list) {
     list.clear();
     std::error_code ec;
-    std::vector<fs::path> found;
+    // (file name, path): the names are taken once, not in every comparison of the sort.
+    std::vector<std::pair<std::string, fs::path>> found;
     for (fs::directory_iterator it(ToPath(folder), ec), end; !ec && it != end; it.increment(ec)) {
         std::error_code typeError;
         if (it->is_regular_file(typeError)) {
-            found.push_back(it->path());
+            found.emplace_back(it->path().filename().string(), it->path());
         }
     }
     if (ec) {
         return false;
     }
-    std::sort(found.begin(), found.end(), [](fs::path const& a, fs::path const& b) {
-        return a.filename().string() < b.filename().string();
-    });
-    for (fs::path const& p : found) {
-        list.push_back(FromPath(p));
+    std::sort(found.begin(), found.end(), [](auto const& a, auto const& b) { return a.first < b.first; });
+    list.reserve(found.size());
+    for (auto const& entry : found) {
+        list.push_back(FromPath(entry.second));
     }
     return true;
 }
