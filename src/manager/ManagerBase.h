@@ -14,7 +14,7 @@
 
 #include <map>
 #include <memory>
-#include <set>
+#include <unordered_set>
 #include <string>
 #include <vector>
 
@@ -73,7 +73,7 @@ public:
     Table const& GetWorkspaceTable() const { return workspaces_; }
     Table const& GetArchiveTable() const { return archives_; }
     Table const& GetSystemTable() const { return systems_; }
-    std::set<std::u16string> const& GetKnownFiles() const { return knownFiles_; }
+    std::unordered_set<std::u16string> const& GetKnownFiles() const { return knownFiles_; }
 
 protected:
     // --- Storage, supplied by a derived class ---
@@ -95,7 +95,7 @@ protected:
     static void AddEntry(Table& table, std::u16string const& path, std::u16string name);
     // The localisation key a new workspace of this name stores, or empty.
     std::u16string NameKeyFor(std::u16string const& name) const;
-    std::set<std::u16string>& KnownFiles() { return knownFiles_; }
+    std::unordered_set<std::u16string>& KnownFiles() { return knownFiles_; }
     BuiltInWorkspaceProviderBase* BuiltInProvider() const { return builtIn_; }
     SystemWorkspaceProviderBase* SystemProvider() const { return system_; }
 
@@ -114,7 +114,8 @@ private:
 
     BuiltInWorkspaceProviderBase* builtIn_;
     SystemWorkspaceProviderBase* system_;
-    std::set<std::u16string> knownFiles_;
+    // Files whose cached record matched at start-up (only asked whether it holds a path).
+    std::unordered_set<std::u16string> knownFiles_;
     Workspace& workspace_;
     std::u16string current_;
     Table workspaces_;
