@@ -470,3 +470,40 @@ TEST_F(ManagerStories, LongNamesAreShortenedInTheMenuButKeptWholeForTheCommand) 
     ASSERT_TRUE(helper->WorkspaceNameForCmd(10, whole));
     EXPECT_EQ(whole, longName);
 }
+
+TEST_F(ManagerStories, TheMainWindowGetsItsRememberedPlaceOrTheDefaultOne) {
+    manager = std::make_unique<Manager>(*workspace, saved, archived, settings, nullptr, false);
+    std::vector<std::u16string> names;
+    EXPECT_THROW(manager->GetWorkspaces(names), orvcore::config::Error); // not initialised yet
+    manager->Initialize();
+    // Without settings: maximised on the first monitor.
+    manager->ApplyDefaultMainWindowSize();
+    EXPECT_EQ(Desktop::Get().GetPlacement(appWindow).showCmd, 3u);
+    // Remembered by a flush, given back later.
+    RectT placed(150, 120, 900, 600);
+    orvui::ui::WindowPlacement normal = Desktop::Get().GetPlacement(appWindow);
+    normal.showCmd = 1;
+    normal.normal = placed;
+    Desktop::Get().SetPlacement(appWindow, normal);
+    ASSERT_EQ(Desktop::Get().GetWindowRect(appWindow), placed);
+    PropList empty;
+    orvcore::proplist::utils::SavePropList(settings, empty);
+    manager->FlushManagerSettings();
+    Desktop::Get().SetWindowRect(appWindow, RectT(10, 10, 500, 400));
+    manager->ApplyDefaultMainWindowSize();
+    EXPECT_EQ(Desktop::Get().GetWindowRect(appWindow), placed);
+}
+
+TEST_F(ManagerStories, AddingOverABuiltInPlaceholderLaysItOutFirstThenTakesTheDocument) {
+    BuiltIns builtIns;
+    Start(&builtIns);
+    BuildTwoFrames();
+    PropList document;
+    SaveWorkspace(*workspace, document, u"");
+    ASSERT_TRUE(manager->AddWorkspace(u"Mixing", document, true));
+    EXPECT_EQ(builtIns.builds, 1);
+    EXPECT_EQ(manager->GetCurrentWorkspace(), u"Mixing");
+    EXPECT_EQ(FrameTypes(), (std::vector<std::string>{"editor", "browser"}));
+    ASSERT_NE(manager->GetWorkspaceTable().at(u"Mixing"), nullptr);
+    EXPECT_FALSE(manager->AddWorkspace(u"", document, true));
+}
