@@ -347,6 +347,35 @@ bool ManagerBase::LayOutBuiltIn(std::u16string const& name) {
     return true;
 }
 
+bool ManagerBase::LayOutBuiltInAsUserWorkspace(std::u16string const& name) {
+    if (!LayOutBuiltIn(name)) {
+        return false;
+    }
+    std::unique_ptr<WorkspaceEntryImplData> made = NewUserWorkspace(name);
+    DoSaveWorkspace(name, made.get());
+    workspaces_[name] = std::move(made);
+    return true;
+}
+
+std::unique_ptr<WorkspaceEntryImplData> ManagerBase::NewUserWorkspace(std::u16string const& name) {
+    std::unique_ptr<WorkspaceEntryImplData> entry = DoCreateUserWorkspace(name);
+    if (!entry) {
+        ThrowError(orvcore::config::errors::CannotCreateWorkspace);
+    }
+    return entry;
+}
+
+void ManagerBase::KeepAsUserWorkspaceWithArchive(std::u16string const& name,
+                                                 std::unique_ptr<WorkspaceEntryImplData> entry) {
+    DoSaveWorkspace(name, entry.get());
+    std::u16string fileName = FileNameOf(entry->GetFilePath());
+    workspaces_[name] = std::move(entry);
+    if (std::unique_ptr<WorkspaceEntryImplData> archive = DoArchiveWorkspace(fileName)) {
+        DoSaveWorkspace(name, archive.get());
+        archives_[name] = std::move(archive);
+    }
+}
+
 WorkspaceEntryImplData* ManagerBase::CopySystemWorkspace(std::u16string const& name) {
     if (!system_) {
         return nullptr;
@@ -399,15 +428,9 @@ bool ManagerBase::SetCurrentWorkspace(std::u16string const& name) {
             return false;
         }
     } else {
-        if (!LayOutBuiltIn(name)) {
+        if (!LayOutBuiltInAsUserWorkspace(name)) {
             return false;
         }
-        std::unique_ptr<WorkspaceEntryImplData> made = DoCreateUserWorkspace(name);
-        if (!made) {
-            ThrowError(orvcore::config::errors::CannotCreateWorkspace);
-        }
-        DoSaveWorkspace(name, made.get());
-        workspaces_[name] = std::move(made);
     }
     NotifyCurrent(name);
     return result;
@@ -421,17 +444,7 @@ void ManagerBase::CreateUserWorkspace(std::u16string const& name) {
         ThrowError(orvcore::config::errors::WorkspaceAlreadyExists);
     }
     SaveCurrent();
-    std::unique_ptr<WorkspaceEntryImplData> entry = DoCreateUserWorkspace(name);
-    if (!entry) {
-        ThrowError(orvcore::config::errors::CannotCreateWorkspace);
-    }
-    DoSaveWorkspace(name, entry.get());
-    std::u16string fileName = FileNameOf(entry->GetFilePath());
-    workspaces_[name] = std::move(entry);
-    if (std::unique_ptr<WorkspaceEntryImplData> archive = DoArchiveWorkspace(fileName)) {
-        DoSaveWorkspace(name, archive.get());
-        archives_[name] = std::move(archive);
-    }
+    KeepAsUserWorkspaceWithArchive(name, NewUserWorkspace(name));
     current_ = name;
     RebuildAll();
     NotifyCurrent(name);
@@ -450,15 +463,9 @@ bool ManagerBase::AddWorkspace(std::u16string const& name, PropList& document, b
         if (found->second) {
             DoSaveWorkspace(name, found->second.get());
         } else {
-            if (!LayOutBuiltIn(name)) {
+            if (!LayOutBuiltInAsUserWorkspace(name)) {
                 return false;
             }
-            std::unique_ptr<WorkspaceEntryImplData> made = DoCreateUserWorkspace(name);
-            if (!made) {
-                ThrowError(orvcore::config::errors::CannotCreateWorkspace);
-            }
-            DoSaveWorkspace(name, made.get());
-            workspaces_[name] = std::move(made);
         }
         bool ok = RestoreWorkspace(workspace_, document, sizeMainFrame_, true, forceConstraintLayout_);
         if (ok) {
@@ -466,19 +473,10 @@ bool ManagerBase::AddWorkspace(std::u16string const& name, PropList& document, b
         }
         return ok;
     }
-    std::unique_ptr<WorkspaceEntryImplData> entry = DoCreateUserWorkspace(name);
-    if (!entry) {
-        ThrowError(orvcore::config::errors::CannotCreateWorkspace);
-    }
+    std::unique_ptr<WorkspaceEntryImplData> entry = NewUserWorkspace(name);
     bool ok = RestoreWorkspace(workspace_, document, sizeMainFrame_, true, forceConstraintLayout_);
     if (ok) {
-        DoSaveWorkspace(name, entry.get());
-        std::u16string fileName = FileNameOf(entry->GetFilePath());
-        workspaces_[name] = std::move(entry);
-        if (std::unique_ptr<WorkspaceEntryImplData> archive = DoArchiveWorkspace(fileName)) {
-            DoSaveWorkspace(name, archive.get());
-            archives_[name] = std::move(archive);
-        }
+        KeepAsUserWorkspaceWithArchive(name, std::move(entry));
         RebuildAll();
         NotifyCurrent(name);
     }

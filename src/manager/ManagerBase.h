@@ -14,8 +14,8 @@
 
 #include <map>
 #include <memory>
-#include <unordered_set>
 #include <string>
+#include <unordered_set>
 #include <vector>
 
 namespace orvcore::proplist {
@@ -107,6 +107,13 @@ private:
     bool IsBuiltIn(std::u16string const& name) const;
     // Lays a built-in workspace out from its builder; false when the provider has none.
     bool LayOutBuiltIn(std::u16string const& name);
+    // The same, then written as the user file the name maps to from now on.
+    bool LayOutBuiltInAsUserWorkspace(std::u16string const& name);
+    // A new user file's entry; raises CannotCreateWorkspace when none can be made.
+    std::unique_ptr<WorkspaceEntryImplData> NewUserWorkspace(std::u16string const& name);
+    // Writes the live arrangement as the name's file and as its archived first layout.
+    void KeepAsUserWorkspaceWithArchive(std::u16string const& name,
+                                        std::unique_ptr<WorkspaceEntryImplData> entry);
     WorkspaceEntryImplData* CopySystemWorkspace(std::u16string const& name);
     void SaveCurrent();
     void RebuildAll();
