@@ -82,14 +82,7 @@ void WorkspaceBuilder::BuildWorkspace() {
         }
     }
     for (WindowRecord& record : windows_) {
-        boost::intrusive_ptr<TopLevelWindow> window;
-        if (!existing.empty()) {
-            window = existing.front();
-            existing.pop_front();
-            RemoveStaticElements(*window);
-        } else {
-            window = workspace_.AddTopLevelWindow(workspace_.GetMainTopLevelWindow() == nullptr, nullptr);
-        }
+        boost::intrusive_ptr<TopLevelWindow> window = NextWindowToFill(workspace_, existing);
         (void)window->TakeHiddenFrames(); // their panels are in the pool
         RectT rect = record.rect;
         if (orvui::utility::MonitorInfo* monitors = workspace_.ORV_GetMonitorInfo()) {

@@ -272,6 +272,17 @@ struct Restorer {
 
 // --- Shared with the builders ---
 
+boost::intrusive_ptr<TopLevelWindow>
+NextWindowToFill(Workspace& workspace, std::list<boost::intrusive_ptr<TopLevelWindow>>& existing) {
+    if (existing.empty()) {
+        return workspace.AddTopLevelWindow(workspace.GetMainTopLevelWindow() == nullptr, nullptr);
+    }
+    boost::intrusive_ptr<TopLevelWindow> window = existing.front();
+    existing.pop_front();
+    RemoveStaticElements(*window);
+    return window;
+}
+
 void RemoveStaticElements(TopLevelWindow& window) {
     for (StaticPlace const& place : StaticPlaces) {
         if (window.HasStaticElement(place.side)) {
@@ -561,14 +572,7 @@ bool RestoreWorkspace(Workspace& workspace, PropList const& list, bool restoreMa
     std::int32_t count = 0;
     list.GetValue("SerCfgMax", count);
     for (std::int32_t i = 0; i < count; ++i) {
-        boost::intrusive_ptr<TopLevelWindow> window;
-        if (!existing.empty()) {
-            window = existing.front();
-            existing.pop_front();
-            RemoveStaticElements(*window);
-        } else {
-            window = workspace.AddTopLevelWindow(workspace.GetMainTopLevelWindow() == nullptr, nullptr);
-        }
+        boost::intrusive_ptr<TopLevelWindow> window = NextWindowToFill(workspace, existing);
         if (PropList const* windowList = list.GetSubList(Numbered("TopLevelFrame-", std::size_t(i)))) {
             RestoreTopLevelWindow(*window, *windowList, pool,
                                   window->IsMain() ? restoreMainWindowBounds : true, restoreMaximizedFrames,

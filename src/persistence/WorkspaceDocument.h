@@ -63,6 +63,10 @@ ReusableTabPool CollectReusableTabs(Workspace& workspace);
 // Takes a panel out of whatever holds it (a frame's tabs or a tabless frame).
 void Unplace(TabPanel& panel);
 void RemoveStaticElements(TopLevelWindow& window);
+// The next window to fill: the first of the existing ones (taken out of the list, its static
+// elements removed), else a new one (the main window when the workspace has none yet).
+boost::intrusive_ptr<TopLevelWindow>
+NextWindowToFill(Workspace& workspace, std::list<boost::intrusive_ptr<TopLevelWindow>>& existing);
 void PutOnSide(Splitter* parent, LayoutManagerElement* child, bool leftOrTop);
 // Closed tabs (type, state) of a frame: a type that hides when closed comes back as a kept panel
 // (from the pool or its creator) in the keeper frame; the others are returned, to be remembered.
