@@ -507,3 +507,30 @@ TEST_F(ManagerStories, AddingOverABuiltInPlaceholderLaysItOutFirstThenTakesTheDo
     ASSERT_NE(manager->GetWorkspaceTable().at(u"Mixing"), nullptr);
     EXPECT_FALSE(manager->AddWorkspace(u"", document, true));
 }
+
+TEST_F(ManagerStories, ABuiltInResetsToItsBuilderAndAResetManagerKeepsShippedWorkspaces) {
+    BuiltIns builtIns;
+    TempDir shipped;
+    BuildTwoFrames();
+    PropList document;
+    SaveWorkspace(*workspace, document, u"Colour");
+    orvcore::proplist::utils::SavePropList(shipped.U16("Colour.xml"), document);
+    ShippedWorkspaces system(shipped.U16());
+    manager = std::make_unique<Manager>(*workspace, saved, archived, settings, &builtIns, &system, false);
+    manager->Initialize();
+    ASSERT_TRUE(manager->SetCurrentWorkspace(u"Mixing"));
+    main->GetFrame(0)->AddTab("editor", true);
+    manager->RevertWorkspace(u"Mixing");
+    EXPECT_EQ(main->GetFrame(0)->GetTabCount(), 1); // laid out by its builder again
+    EXPECT_EQ(builtIns.builds, 2);
+    EXPECT_THROW(manager->RevertWorkspace(u"Nobody"), orvcore::config::Error);
+
+    ASSERT_TRUE(manager->SetCurrentWorkspace(u"Colour"));
+    manager->CreateUserWorkspace(u"Mine");
+    manager->ResetWorkspaceMgr();
+    EXPECT_FALSE(manager->HasCurrentWorkspace());
+    EXPECT_EQ(Names(), (std::vector<std::u16string>{u"Colour", u"Editing", u"Mixing"}));
+    EXPECT_TRUE(FilesIn(saved).empty());
+    EXPECT_TRUE(FilesIn(archived).empty());
+    EXPECT_TRUE(FileUtils::FileExists(shipped.U16("Colour.xml"))); // shipped files are never touched
+}
