@@ -126,6 +126,7 @@ void Manager::DoLoadWorkspace(std::u16string const&, WorkspaceEntryImplData cons
 }
 
 bool Manager::LoadManagerSettings(PropList& out) {
+    settingsDamaged_ = false;
     if (!FileUtils::FileExists(settingsFile_)) {
         return false;
     }
@@ -133,7 +134,8 @@ bool Manager::LoadManagerSettings(PropList& out) {
         orvcore::proplist::utils::LoadPropList(settingsFile_, out, true);
     } catch (orvcore::config::Error const&) {
         out = PropList();
-        return false; // a damaged settings document counts as none, and is left as it is
+        settingsDamaged_ = true; // counts as none, and is left as it is until the next flush
+        return false;
     }
     return true;
 }
@@ -148,6 +150,7 @@ void Manager::SaveManagerSettings(PropList const& list) {
 
 void Manager::ClearManagerSettings() {
     FileUtils::RemoveFile(settingsFile_);
+    settingsDamaged_ = false;
 }
 
 } // namespace orvworkspace::workspace

@@ -30,6 +30,7 @@ protected:
     bool LoadManagerSettings(orvcore::proplist::PropList& out) override;
     void SaveManagerSettings(orvcore::proplist::PropList const& list) override;
     void ClearManagerSettings() override;
+    bool ManagerSettingsDamaged() const override { return settingsDamaged_; }
     std::u16string GetUserWorkspaceFolder() const override { return savedFolder_; }
     std::unique_ptr<WorkspaceEntryImplData> DoArchiveWorkspace(std::u16string const& fileName) override;
 
@@ -42,6 +43,7 @@ private:
     std::u16string archiveFolder_;
     std::u16string settingsFile_;
     std::size_t filesRead_ = 0;
+    bool settingsDamaged_ = false;
 };
 
 } // namespace orvworkspace::workspace

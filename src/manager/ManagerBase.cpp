@@ -179,15 +179,17 @@ void ManagerBase::AddBuiltInPlaceholders(PropList settings, bool haveSettings) {
     } else {
         settings.SetValue("BuiltIns", added);
     }
-    SaveManagerSettings(settings);
+    if (!ManagerSettingsDamaged()) {
+        SaveManagerSettings(settings);
+    }
 }
 
 // --- Settings ---
 
 void ManagerBase::FlushManagerSettings() {
     PropList settings;
-    if (!LoadManagerSettings(settings)) {
-        return;
+    if (!LoadManagerSettings(settings) && !ManagerSettingsDamaged()) {
+        return; // no settings document yet: the records wait for one
     }
     settings.SetValue("WorkspaceConfigVersion", std::string(ConfigVersion));
     PropList* window = settings.GetSubList("MainWndPos");

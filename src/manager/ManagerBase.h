@@ -87,6 +87,9 @@ protected:
     virtual bool LoadManagerSettings(orvcore::proplist::PropList& out) = 0;
     virtual void SaveManagerSettings(orvcore::proplist::PropList const& list) = 0;
     virtual void ClearManagerSettings() = 0;
+    // Whether a settings document exists but cannot be read: it counts as absent, is not written
+    // over at start-up, and is replaced by the next flush.
+    virtual bool ManagerSettingsDamaged() const { return false; }
     virtual std::u16string GetUserWorkspaceFolder() const = 0;
     virtual std::unique_ptr<WorkspaceEntryImplData> DoArchiveWorkspace(std::u16string const& fileName) = 0;
 

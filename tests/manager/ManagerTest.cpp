@@ -534,3 +534,18 @@ TEST_F(ManagerStories, ABuiltInResetsToItsBuilderAndAResetManagerKeepsShippedWor
     EXPECT_TRUE(FilesIn(archived).empty());
     EXPECT_TRUE(FileUtils::FileExists(shipped.U16("Colour.xml"))); // shipped files are never touched
 }
+
+TEST_F(ManagerStories, ADamagedSettingsDocumentCountsAsNoneUntilTheNextFlushReplacesIt) {
+    BuiltIns builtIns;
+    prefs.Write("WSMgrCfg", "<prop.list><key>Work");
+    Start(&builtIns);
+    EXPECT_EQ(Names(), (std::vector<std::u16string>{u"Editing", u"Mixing"}));
+    EXPECT_EQ(FileUtils::ReadWholeFile(settings, 1 << 20), "<prop.list><key>Work"); // left as it was
+    manager->CreateUserWorkspace(u"Mine");
+    manager->FlushManagerSettings();
+    PropList doc;
+    ASSERT_TRUE(orvcore::proplist::utils::LoadPropList(settings, doc, false));
+    std::vector<std::u16string> names;
+    doc.GetValue("UserNames", names);
+    EXPECT_EQ(names, (std::vector<std::u16string>{u"Mine", u"Mine"})); // the archive, then the user file
+}
