@@ -6,6 +6,7 @@
 #include "host/core/Error.h"
 #include "host/core/FileUtils.h"
 #include "host/core/PropListUtils.h"
+#include "host/core/TextConversion.h"
 #include "host/ui/Menu.h"
 #include "manager/Manager.h"
 #include "manager/PlatformMenuHelperBase.h"
@@ -63,14 +64,23 @@ protected:
         WorkspaceTest::TearDown();
         unsetenv("ORV_PREFS_DIR");
     }
-    Manager& Start(BuiltInWorkspaceProviderBase* builtIn = nullptr) {
-        manager = std::make_unique<Manager>(*workspace, saved, archived, settings, builtIn, false);
+    Manager& Start(BuiltInWorkspaceProviderBase* builtIn = nullptr,
+                   SystemWorkspaceProviderBase* system = nullptr) {
+        manager = std::make_unique<Manager>(*workspace, saved, archived, settings, builtIn, system, false);
         manager->Initialize();
         return *manager;
     }
-    void Restart(BuiltInWorkspaceProviderBase* builtIn = nullptr) {
+    void Restart(BuiltInWorkspaceProviderBase* builtIn = nullptr,
+                 SystemWorkspaceProviderBase* system = nullptr) {
         manager.reset();
-        Start(builtIn);
+        Start(builtIn, system);
+    }
+    // The live arrangement, shipped as a system workspace file in a folder.
+    void Ship(TempDir const& folder, std::u16string const& name) {
+        PropList document;
+        SaveWorkspace(*workspace, document, name);
+        orvcore::proplist::utils::SavePropList(folder.U16(orvcore::utility::UTF16to8(name) + ".xml"),
+                                               document);
     }
     std::vector<std::u16string> Names() const {
         std::vector<std::u16string> names;
@@ -303,12 +313,9 @@ public:
 TEST_F(ManagerStories, ASystemWorkspaceIsCopiedOnceAndResetsToItsShippedFile) {
     TempDir shipped;
     BuildTwoFrames();
-    PropList document;
-    SaveWorkspace(*workspace, document, u"Colour");
-    orvcore::proplist::utils::SavePropList(shipped.U16("Colour.xml"), document);
+    Ship(shipped, u"Colour");
     ShippedWorkspaces system(shipped.U16());
-    manager = std::make_unique<Manager>(*workspace, saved, archived, settings, nullptr, &system, false);
-    manager->Initialize();
+    Start(nullptr, &system);
     EXPECT_EQ(Names(), std::vector<std::u16string>{u"Colour"});
     EXPECT_TRUE(system.FindWorkspace(u"Colour"));
     EXPECT_EQ(manager->GetWorkspaceTable().at(u"Colour"), nullptr);
@@ -326,9 +333,7 @@ TEST_F(ManagerStories, ASystemWorkspaceIsCopiedOnceAndResetsToItsShippedFile) {
     manager->RevertWorkspace(u"Colour");
     EXPECT_EQ(main->GetFrame(0)->GetTabCount(), 1);
     // Chosen again after a restart, the user's copy is used as it is.
-    manager.reset();
-    manager = std::make_unique<Manager>(*workspace, saved, archived, settings, nullptr, &system, false);
-    manager->Initialize();
+    Restart(nullptr, &system);
     ASSERT_TRUE(manager->SetCurrentWorkspace(u"Colour"));
     EXPECT_EQ(main->GetFrame(0)->GetTabCount(), 2);
 }
@@ -512,12 +517,9 @@ TEST_F(ManagerStories, ABuiltInResetsToItsBuilderAndAResetManagerKeepsShippedWor
     BuiltIns builtIns;
     TempDir shipped;
     BuildTwoFrames();
-    PropList document;
-    SaveWorkspace(*workspace, document, u"Colour");
-    orvcore::proplist::utils::SavePropList(shipped.U16("Colour.xml"), document);
+    Ship(shipped, u"Colour");
     ShippedWorkspaces system(shipped.U16());
-    manager = std::make_unique<Manager>(*workspace, saved, archived, settings, &builtIns, &system, false);
-    manager->Initialize();
+    Start(&builtIns, &system);
     ASSERT_TRUE(manager->SetCurrentWorkspace(u"Mixing"));
     main->GetFrame(0)->AddTab("editor", true);
     manager->RevertWorkspace(u"Mixing");

@@ -551,25 +551,6 @@ TEST_F(Dragging, EscapeOrALostCaptureEndsATabDragWithoutDocking) {
 }
 
 TEST_F(Dragging, TheHostHearsWhenDragsBeginAndEnd) {
-    class Listening : public HostWorkspace {
-    public:
-        void NotifyTabDragBegin(TabPanel* p) override { log.push_back("tab begin " + p->GetTabType()); }
-        void NotifyTabDragEnd(TabPanel* p) override { log.push_back("tab end " + p->GetTabType()); }
-        void NotifySplitterDragBegin(TopLevelWindow*) override { log.push_back("bar begin"); }
-        void NotifySplitterDragEnd(TopLevelWindow*) override { log.push_back("bar end"); }
-    };
-    CloseWindows();
-    Desktop::Reset();
-    DesktopScenario::SetUp();
-    appWindow = Desktop::Get().CreateNativeWindow(
-        u"Host", orvui::ui::style::Popup | orvui::ui::style::Caption | orvui::ui::style::Visible, 0, 0,
-        RectT(100, 80, 1000, 700));
-    workspace = new Listening;
-    Register({"editor", EditorPaint});
-    Register({"browser", BrowserPaint});
-    workspace->AttachToClientApp(nullptr, nullptr, appWindow, nullptr, false);
-    main = workspace->GetMainTopLevelWindow();
-    BuildTwoFrames();
     PointT bar = Bar();
     Press(bar);
     MoveTo(PointT(bar.x + 30, bar.y));

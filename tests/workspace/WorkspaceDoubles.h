@@ -118,6 +118,10 @@ public:
         log.push_back("pre-orphaning " + panel->GetTabType());
     }
     void NotifyOrphaning(TabPanel* panel) override { log.push_back("orphaning " + panel->GetTabType()); }
+    void NotifyTabDragBegin(TabPanel* panel) override { log.push_back("tab begin " + panel->GetTabType()); }
+    void NotifyTabDragEnd(TabPanel* panel) override { log.push_back("tab end " + panel->GetTabType()); }
+    void NotifySplitterDragBegin(TopLevelWindow*) override { log.push_back("bar begin"); }
+    void NotifySplitterDragEnd(TopLevelWindow*) override { log.push_back("bar end"); }
     std::vector<std::string> log;
 };
 
