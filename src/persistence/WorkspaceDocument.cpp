@@ -417,12 +417,14 @@ void RestoreTopLevelWindow(TopLevelWindow& window, PropList const& list, Reusabl
     }
     UI_NodeManager::GroupingFocusChanges grouping;
     boost::intrusive_ptr<TopLevelWindow> keep(window.IsReferenced() ? &window : nullptr);
-    // The window is painted once, after the restore, not after every step of rebuilding it.
+    // The window is painted once, after the restore, not after every step of rebuilding it. It is
+    // marked whole from the start, so the many nodes that move on the way mark nothing more.
     struct RedrawsSuspended {
         TopLevelWindow& window;
         explicit RedrawsSuspended(TopLevelWindow& w)
             : window(w) {
             window.SuspendRedraws(true);
+            window.UI_Invalidate();
         }
         ~RedrawsSuspended() {
             window.SuspendRedraws(false);

@@ -67,8 +67,7 @@ NativeWindow Desktop::CreateNativeWindow(std::u16string const& title, std::uint3
     if (child) {
         // A child window may start without a parent (a panel made before its frame takes it).
         if (Find(ownerOrParent)) {
-            record.parent = ownerOrParent;
-            Find(ownerOrParent)->children.push_back(record.handle);
+            LinkChild(record, ownerOrParent);
         }
     } else {
         // As on the platform, a window is owned by the top-level window of the one named, never by
@@ -92,15 +91,14 @@ void Desktop::DestroyNativeWindow(NativeWindow w) {
     if (!record) {
         return;
     }
-    for (NativeWindow child : std::vector<NativeWindow>(record->children)) {
+    for (NativeWindow child : std::vector<NativeWindow>(record->children.begin(), record->children.end())) {
         DestroyNativeWindow(child);
     }
     record = Find(w);
-    if (record->parent) {
-        auto& siblings = Find(record->parent)->children;
-        siblings.erase(std::remove(siblings.begin(), siblings.end(), w), siblings.end());
+    UnlinkChild(*record);
+    if (!(record->style & style::Child)) {
+        zOrder_.erase(std::remove(zOrder_.begin(), zOrder_.end(), w), zOrder_.end());
     }
-    zOrder_.erase(std::remove(zOrder_.begin(), zOrder_.end(), w), zOrder_.end());
     // Windows it owned lose their owner, as the platform would leave them. Child windows own none,
     // and skipping the walk for them keeps tearing down a frame tree linear.
     if (!(record->style & style::Child)) {
@@ -153,14 +151,23 @@ void Desktop::SetParent(NativeWindow child, NativeWindow parent) {
         (parent && !Find(parent))) {
         return;
     }
-    if (NativeWindowRecord* old = Find(record->parent)) {
-        old->children.erase(std::remove(old->children.begin(), old->children.end(), child),
-                            old->children.end());
-    }
-    record->parent = parent;
+    UnlinkChild(*record);
     if (parent) {
-        Find(parent)->children.push_back(child);
+        LinkChild(*record, parent);
     }
+}
+
+void Desktop::LinkChild(NativeWindowRecord& child, NativeWindow parent) {
+    std::list<NativeWindow>& siblings = Find(parent)->children;
+    child.parent = parent;
+    child.placeAmongSiblings = siblings.insert(siblings.end(), child.handle);
+}
+
+void Desktop::UnlinkChild(NativeWindowRecord& child) {
+    if (NativeWindowRecord* parent = Find(child.parent)) {
+        parent->children.erase(child.placeAmongSiblings);
+    }
+    child.parent = 0;
 }
 
 NativeWindow Desktop::GetOwner(NativeWindow w) const {
@@ -319,6 +326,11 @@ void Desktop::InvalidateArea(NativeWindow w, RectT const& global) {
 bool Desktop::IsDirty(NativeWindow w) const {
     NativeWindowRecord const* record = Find(TopLevelOf(w));
     return record && (record->dirty || !record->dirtyArea.IsEmpty());
+}
+
+bool Desktop::IsWhollyDirty(NativeWindow w) const {
+    NativeWindowRecord const* record = Find(TopLevelOf(w));
+    return record && record->dirty;
 }
 
 void Desktop::ClearDirty(NativeWindow w) {

@@ -25,6 +25,7 @@
 
 #include <atomic>
 #include <functional>
+#include <list>
 #include <map>
 #include <memory>
 #include <mutex>
@@ -77,7 +78,10 @@ struct NativeWindowRecord {
     std::map<std::string, void*> properties;
     unsigned long threadId = 0;
     OS_Window* object = nullptr;
-    std::vector<NativeWindow> children; // bottom to top
+    // Bottom to top. A list, with each child knowing its place in it, so that a parent with many
+    // child windows (a frame each) loses any one of them in constant time.
+    std::list<NativeWindow> children;
+    std::list<NativeWindow>::iterator placeAmongSiblings;
     // The window's last painted image, chrome included (top-level windows only).
     canvasor::Image image;
 };
@@ -142,6 +146,9 @@ public:
     // Marks part of a window (global coordinates) for painting; the marks of a window add up.
     void InvalidateArea(NativeWindow w, RectT const& global);
     bool IsDirty(NativeWindow w) const;
+    // Whether the whole of the window's top-level window is already marked, so that marking a part
+    // of it adds nothing.
+    bool IsWhollyDirty(NativeWindow w) const;
     void ClearDirty(NativeWindow w);
     // Paints a top-level window's image now (its chrome, then its nodes) and clears its mark.
     void PaintWindow(NativeWindow w);
@@ -237,6 +244,9 @@ private:
     enum class Drag { None, Move, Resize };
 
     NativeWindowRecord* Find(NativeWindow w);
+    // Puts a child window on top of its parent's children, or takes it from them.
+    void LinkChild(NativeWindowRecord& child, NativeWindow parent);
+    void UnlinkChild(NativeWindowRecord& child);
     NativeWindowRecord const* Find(NativeWindow w) const;
     NativeWindow TopLevelOf(NativeWindow w) const;
     NativeWindow DeepestChildAt(NativeWindow w, PointT global) const;

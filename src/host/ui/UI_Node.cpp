@@ -253,7 +253,9 @@ void UI_Node::UI_Invalidate(RectF const* area, unsigned) {
             window = w;
         }
     }
-    if (!window) {
+    // Once the whole window is marked (as while a workspace is being rebuilt), there is nothing to
+    // add, and the node's global position need not be worked out.
+    if (!window || Desktop::Get().IsWhollyDirty(window->GetPlatformWindow())) {
         return;
     }
     RectF local = area ? *area : UI_GetLocalBounds();
