@@ -27,11 +27,20 @@ Manager::Manager(Workspace& workspace, std::u16string savedFolder, std::u16strin
     : Manager(workspace, std::move(savedFolder), std::move(archiveFolder), std::move(settingsFile), builtIn,
               nullptr, sizeMainFrame) {}
 
+namespace {
+// The ".xml" extension as File::GetExtension sees it (a name that is only ".xml" has none), without
+// building a path object for every file of a large folder.
+bool HasXmlExtension(std::u16string const& path) {
+    std::size_t n = path.size();
+    return n > 4 && path.compare(n - 4, 4, u".xml") == 0 && path[n - 5] != u'/';
+}
+} // namespace
+
 void Manager::ScanFolder(std::u16string const& folder, Table& table) {
     std::vector<std::u16string> files;
     FileUtils::ContainedFiles(folder, files);
     for (std::u16string const& path : files) {
-        if (KnownFiles().count(path) || orvcore::filesupport::File(path).GetExtension() != u".xml") {
+        if (KnownFiles().count(path) || !HasXmlExtension(path)) {
             continue;
         }
         PropList document;

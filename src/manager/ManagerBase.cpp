@@ -5,6 +5,7 @@
 #include "host/core/Error.h"
 #include "host/core/ErrorTable.h"
 #include "host/core/File.h"
+#include "host/core/FileTimes.h"
 #include "host/core/FileUtils.h"
 #include "host/core/Localizer.h"
 #include "host/core/PropList.h"
@@ -112,9 +113,10 @@ void ManagerBase::ReadSettingsCache(PropList const& settings, bool haveSettings)
     if (paths.size() != times.size() || names.size() != times.size() || types.size() != times.size()) {
         return; // records that do not line up are no records
     }
+    // One look at each file, all at once: a missing one has no time.
+    std::vector<boost::posix_time::ptime> modifiedTimes = orvcore::filesupport::ModifiedTimes(paths);
     for (std::size_t i = 0; i < times.size(); ++i) {
-        // One look at the file: a missing one has no time.
-        boost::posix_time::ptime modified = orvcore::filesupport::File(paths[i]).Modified();
+        boost::posix_time::ptime modified = modifiedTimes[i];
         if (modified.is_special() || orvcore::utility::ToIsoString(modified) != times[i]) {
             continue; // changed or gone: the folder scans find it again
         }

@@ -4,6 +4,7 @@
 #include "host/core/Error.h"
 #include "host/core/ErrorTable.h"
 #include "host/core/File.h"
+#include "host/core/FileTimes.h"
 #include "host/core/FileUtils.h"
 #include "support/FileSizeLimit.h"
 #include "support/TempDir.h"
@@ -146,6 +147,46 @@ TEST(FileUtils, ContainedFilesListsOnlyFilesInNameOrder) {
     EXPECT_EQ(list, (std::vector<std::u16string>{tmp.U16("B.xml"), tmp.U16("a.txt"), tmp.U16("b.xml")}));
     EXPECT_FALSE(FileUtils::ContainedFiles(tmp.U16("nowhere"), list));
     EXPECT_TRUE(list.empty());
+    EXPECT_FALSE(FileUtils::ContainedFiles(u"", list));
+}
+
+TEST(FileUtils, ContainedFilesCountsLinksByWhatTheyLeadTo) {
+    TempDir tmp;
+    fs::path target = tmp.Write("target.xml", "");
+    fs::create_directory(tmp.Path() / "folder");
+    fs::create_symlink(target, tmp.Path() / "to-file.xml");
+    fs::create_symlink(tmp.Path() / "folder", tmp.Path() / "to-folder.xml");
+    fs::create_symlink(tmp.Path() / "gone", tmp.Path() / "dangling.xml");
+    std::vector<std::u16string> list;
+    // A trailing separator on the folder gives the same paths.
+    ASSERT_TRUE(FileUtils::ContainedFiles(tmp.U16() + u"/", list));
+    EXPECT_EQ(list, (std::vector<std::u16string>{tmp.U16("target.xml"), tmp.U16("to-file.xml")}));
+}
+
+TEST(FileUtils, ModifiedTimesAgreeWithEachFilesOwn) {
+    TempDir tmp;
+    fs::create_directory(tmp.Path() / "one");
+    fs::create_directory(tmp.Path() / "two");
+    std::vector<std::u16string> paths;
+    long seconds = 1767323045;
+    // Folders alternate and come back, so an open folder must never answer for another one.
+    for (char const* name : {"one/a.xml", "one/b.xml", "two/a.xml", "one/c.xml", "two/b.xml"}) {
+        fs::path p = tmp.Write(name, "x");
+        SetModified(p, seconds++, 0);
+        paths.push_back(TempDir::PathU16(p));
+    }
+    paths.push_back(tmp.U16("one/absent.xml"));
+    paths.push_back(tmp.U16("missing-folder/a.xml"));
+    paths.push_back(u"");
+    std::vector<boost::posix_time::ptime> times = orvcore::filesupport::ModifiedTimes(paths);
+    ASSERT_EQ(times.size(), paths.size());
+    for (std::size_t i = 0; i < paths.size(); ++i) {
+        EXPECT_EQ(ToIsoString(times[i]), ToIsoString(File(paths[i]).Modified())) << i;
+    }
+    EXPECT_EQ(ToIsoString(times[2]), "20260102T030407");
+    EXPECT_TRUE(times[5].is_special());
+    EXPECT_TRUE(times[6].is_special());
+    EXPECT_TRUE(times[7].is_special());
 }
 
 TEST(FileUtils, CopyRemoveAndExistence) {

@@ -202,6 +202,12 @@ TEST_F(ManagerStories, TwoFilesOfOneNameGiveOneWorkspaceAndForeignFilesAreSkippe
     prefs.Write("SavedWorkspaces/broken.xml", "<prop.list><key>");
     prefs.Write("SavedWorkspaces/notes.txt", "hello");
     prefs.Write("SavedWorkspaces/empty.xml", "");
+    // A name that is only the extension is a hidden file without one; an upper-case extension is
+    // another extension.
+    manager->CreateUserWorkspace(u"Hidden");
+    std::u16string hidden = manager->GetWorkspaceTable().at(u"Hidden")->GetFilePath();
+    FileUtils::Copy(hidden, prefs.U16("SavedWorkspaces/Upper.XML"));
+    std::filesystem::rename(orvcore::filesupport::ToPath(hidden), prefs.Path() / "SavedWorkspaces" / ".xml");
     Restart(nullptr);
     EXPECT_EQ(Names(), std::vector<std::u16string>{u"Twin"});
     // The last file read under a name wins (files are read in name order).

@@ -2,7 +2,6 @@
 #include "host/core/DateTime.h"
 
 #include <boost/date_time/posix_time/time_formatters.hpp>
-#include <cstdio>
 
 namespace orvcore::utility {
 
@@ -13,17 +12,26 @@ std::string ToIsoString(boost::posix_time::ptime const& time) {
         // month, day, 'T', hours, minutes, seconds, and ",ffffff" only for a non-zero fraction.
         auto date = time.date().year_month_day();
         auto clock = time.time_of_day();
-        char buffer[48];
-        int n =
-            std::snprintf(buffer, sizeof buffer, "%04d%02d%02dT%02d%02d%02d", int(date.year), int(date.month),
-                          int(date.day), int(clock.hours()), int(clock.minutes()), int(clock.seconds()));
-        std::string text(buffer, std::size_t(n));
+        char buffer[32];
+        char* end = buffer;
+        auto put = [&end](long long value, int digits) {
+            for (int i = digits - 1; i >= 0; --i, value /= 10) {
+                end[i] = char('0' + value % 10);
+            }
+            end += digits;
+        };
+        put(date.year, 4);
+        put(date.month, 2);
+        put(date.day, 2);
+        *end++ = 'T';
+        put(clock.hours(), 2);
+        put(clock.minutes(), 2);
+        put(clock.seconds(), 2);
         if (long long fraction = clock.fractional_seconds(); fraction != 0) {
-            int digits = boost::posix_time::time_duration::num_fractional_digits();
-            n = std::snprintf(buffer, sizeof buffer, ",%0*lld", digits, fraction);
-            text.append(buffer, std::size_t(n));
+            *end++ = ',';
+            put(fraction, int(boost::posix_time::time_duration::num_fractional_digits()));
         }
-        return text;
+        return std::string(buffer, end);
     }
     std::string text = boost::posix_time::to_iso_string(time);
     if (time.is_special()) {

@@ -1,8 +1,8 @@
 // Files: names and times.
 #include "host/core/File.h"
 
-#include <boost/date_time/posix_time/conversion.hpp>
-#include <boost/date_time/posix_time/posix_time_duration.hpp>
+#include "host/core/FileTimes.h"
+
 #include <sys/stat.h>
 
 namespace orvcore::filesupport {
@@ -39,8 +39,7 @@ boost::posix_time::ptime File::Modified() const {
     if (::stat(path_.c_str(), &info) != 0) {
         return boost::posix_time::not_a_date_time;
     }
-    return boost::posix_time::from_time_t(info.st_mtim.tv_sec) +
-           boost::posix_time::microseconds(info.st_mtim.tv_nsec / 1000);
+    return FromFileTime(info.st_mtim.tv_sec, info.st_mtim.tv_nsec);
 }
 
 } // namespace orvcore::filesupport

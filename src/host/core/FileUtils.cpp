@@ -10,6 +10,7 @@
 #include <algorithm>
 #include <cerrno>
 #include <cstring>
+#include <dirent.h>
 #include <fcntl.h>
 #include <fstream>
 #include <string_view>
@@ -24,22 +25,43 @@ using filesupport::ToPath;
 
 bool FileUtils::ContainedFiles(std::u16string const& folder, std::vector<std::u16string>& list) {
     list.clear();
-    std::error_code ec;
-    // (file name, path): the names are taken once, not in every comparison of the sort.
-    std::vector<std::pair<std::string, fs::path>> found;
-    for (fs::directory_iterator it(ToPath(folder), ec), end; !ec && it != end; it.increment(ec)) {
-        std::error_code typeError;
-        if (it->is_regular_file(typeError)) {
-            found.emplace_back(it->path().filename().string(), it->path());
-        }
-    }
-    if (ec) {
+    // Read with readdir rather than a directory iterator: the manager lists its folders at every
+    // start, and the iterator's path objects cost more than the listing itself.
+    std::string base = UTF16to8(folder);
+    DIR* dir = base.empty() ? nullptr : ::opendir(base.c_str());
+    if (!dir) {
         return false;
     }
-    std::sort(found.begin(), found.end(), [](auto const& a, auto const& b) { return a.first < b.first; });
-    list.reserve(found.size());
-    for (auto const& entry : found) {
-        list.push_back(FromPath(entry.second));
+    if (base.back() != '/') {
+        base += '/';
+    }
+    std::vector<std::string> names;
+    bool failed = false;
+    for (;;) {
+        errno = 0;
+        dirent const* entry = ::readdir(dir);
+        if (!entry) {
+            failed = errno != 0;
+            break;
+        }
+        bool regular = entry->d_type == DT_REG;
+        if (entry->d_type == DT_LNK || entry->d_type == DT_UNKNOWN) {
+            // A link counts by what it leads to; some file systems give no type at all.
+            struct stat info {};
+            regular = ::fstatat(::dirfd(dir), entry->d_name, &info, 0) == 0 && S_ISREG(info.st_mode);
+        }
+        if (regular) {
+            names.emplace_back(entry->d_name);
+        }
+    }
+    ::closedir(dir);
+    if (failed) {
+        return false;
+    }
+    std::sort(names.begin(), names.end());
+    list.reserve(names.size());
+    for (std::string const& name : names) {
+        list.push_back(UTF8to16(base + name));
     }
     return true;
 }

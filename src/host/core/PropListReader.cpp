@@ -192,7 +192,9 @@ private:
         if (!ints && type != "utf8" && type != "utf16") {
             Fail(node, "the list of key '" + key + "' has the unknown type '" + type + "'");
         }
+        bool wide = type == "utf16";
         std::vector<std::string> texts;
+        std::vector<std::u16string> wideTexts;
         std::vector<std::int32_t> numbers;
         char const* itemName = ints ? "int" : "ustring";
         for (pugi::xml_node item = node.first_child(); item; item = item.next_sibling()) {
@@ -205,6 +207,8 @@ private:
             }
             if (ints) {
                 numbers.push_back(Number<std::int32_t>(item, key, "signed 32-bit integer"));
+            } else if (wide) {
+                wideTexts.push_back(utility::UTF8to16(Text(item)));
             } else {
                 texts.push_back(Text(item));
             }
@@ -212,15 +216,10 @@ private:
         if (ints) {
             return numbers;
         }
-        if (type == "utf8") {
-            return texts;
+        if (wide) {
+            return wideTexts;
         }
-        std::vector<std::u16string> wide;
-        wide.reserve(texts.size());
-        for (std::string const& t : texts) {
-            wide.push_back(utility::UTF8to16(t));
-        }
-        return wide;
+        return texts;
     }
 
     // The unescaped text content of an element that must hold only text.

@@ -93,7 +93,16 @@ std::u16string UTF8to16(std::string const& utf8) {
     out.reserve(utf8.size());
     std::size_t i = 0;
     while (i < utf8.size()) {
-        AppendUTF16(out, DecodeUTF8(utf8, i));
+        // Runs of ASCII (most paths, keys and names are nothing else) are copied without decoding.
+        std::size_t run = i;
+        while (run < utf8.size() && static_cast<unsigned char>(utf8[run]) < 0x80) {
+            ++run;
+        }
+        out.append(utf8.begin() + std::ptrdiff_t(i), utf8.begin() + std::ptrdiff_t(run));
+        i = run;
+        if (i < utf8.size()) {
+            AppendUTF16(out, DecodeUTF8(utf8, i));
+        }
     }
     return out;
 }
@@ -103,6 +112,10 @@ std::string UTF16to8(std::u16string const& utf16) {
     out.reserve(utf16.size());
     for (std::size_t i = 0; i < utf16.size(); ++i) {
         char32_t c = utf16[i];
+        if (c < 0x80) {
+            out.push_back(char(c));
+            continue;
+        }
         if (c >= 0xD800 && c <= 0xDBFF && i + 1 < utf16.size() && utf16[i + 1] >= 0xDC00 &&
             utf16[i + 1] <= 0xDFFF) {
             c = 0x10000 + ((c - 0xD800) << 10) + (utf16[i + 1] - 0xDC00);
