@@ -55,6 +55,16 @@ OS_Window* OS_Window::FromNative(NativeWindow window) {
     return Desktop::Get().GetObject(window);
 }
 
+std::vector<OS_Window*> OS_Window::UI_EnumerateAllWindows() {
+    std::vector<OS_Window*> windows;
+    for (NativeWindow w : Desktop::Get().EnumerateWindows()) {
+        if (OS_Window* object = FromNative(w)) {
+            windows.push_back(object);
+        }
+    }
+    return windows;
+}
+
 void OS_Window::UI_HandleOSEvent(OS_Event& event) {
     switch (event.message) {
     case message::MouseMove:

@@ -4,6 +4,8 @@
 // rectangle is its client area at (0, 0); a child window's native rectangle follows its node.
 #pragma once
 
+#include <vector>
+
 #include "host/ui/UI_Container.h"
 
 namespace orvui::ui {
@@ -32,6 +34,8 @@ public:
     EventFunction UI_GetEventFunction() const { return eventFunction_; }
     // The toolkit object of a native window, or null.
     static OS_Window* FromNative(NativeWindow window);
+    // The toolkit objects of every top-level window, topmost first (windows without one are left out).
+    static std::vector<OS_Window*> UI_EnumerateAllWindows();
 
     // Handles a message to the native window: mouse messages go to the nodes under the pointer, the
     // caption activation message sets the caption's look; the rest is ignored. Overrides call this
