@@ -1,6 +1,6 @@
 // The workspace manager's stories on a temporary preferences folder: first start with and without
 // built-in workspaces, the settings cache, switching, creating, saving, deleting, resetting.
-#include "workspace/WorkspaceDoubles.h"
+#include "manager/ManagerStories.h"
 
 #include "host/core/Dir.h"
 #include "host/core/Error.h"
@@ -22,90 +22,6 @@
 using namespace orvtest;
 using orvcore::proplist::PropList;
 using orvcore::utility::FileUtils;
-
-namespace {
-
-// Two built-in workspaces: "Editing" (editor | browser) and "Mixing" (a mixer alone).
-class BuiltIns : public BuiltInWorkspaceProviderBase {
-public:
-    void GetWorkspaces(std::vector<std::u16string>& out) const override {
-        out.insert(out.end(), names.begin(), names.end());
-    }
-    std::unique_ptr<WorkspaceBuilder> CreateWorkspaceBuilder(std::u16string const& name,
-                                                             Workspace& ws) const override {
-        ++builds;
-        auto builder = std::make_unique<WorkspaceBuilder>(ws, true, false);
-        RectT rect(100, 80, 1000, 700);
-        if (name == u"Editing") {
-            builder->AddWindow(std::make_unique<SplitterBuilder>(true,
-                                                                 std::make_unique<FrameBuilder>("editor"),
-                                                                 std::make_unique<FrameBuilder>("browser")),
-                               rect, "");
-        } else if (name == u"Mixing") {
-            builder->AddWindow(std::make_unique<FrameBuilder>("mixer"), rect, "");
-        } else {
-            return nullptr;
-        }
-        return builder;
-    }
-    std::vector<std::u16string> names{u"Editing", u"Mixing"};
-    mutable int builds = 0;
-};
-
-class ManagerStories : public WorkspaceTest {
-protected:
-    void SetUp() override {
-        setenv("ORV_PREFS_DIR", prefs.Path().string().c_str(), 1);
-        WorkspaceTest::SetUp();
-        orvworkspace::workspaceutils::GetWorkspaceDirs(nullptr, saved, archived, settings);
-    }
-    void TearDown() override {
-        manager.reset();
-        WorkspaceTest::TearDown();
-        unsetenv("ORV_PREFS_DIR");
-    }
-    Manager& Start(BuiltInWorkspaceProviderBase* builtIn = nullptr,
-                   SystemWorkspaceProviderBase* system = nullptr) {
-        manager = std::make_unique<Manager>(*workspace, saved, archived, settings, builtIn, system, false);
-        manager->Initialize();
-        return *manager;
-    }
-    void Restart(BuiltInWorkspaceProviderBase* builtIn = nullptr,
-                 SystemWorkspaceProviderBase* system = nullptr) {
-        manager.reset();
-        Start(builtIn, system);
-    }
-    // The live arrangement, shipped as a system workspace file in a folder.
-    void Ship(TempDir const& folder, std::u16string const& name) {
-        PropList document;
-        SaveWorkspace(*workspace, document, name);
-        orvcore::proplist::utils::SavePropList(folder.U16(orvcore::utility::UTF16to8(name) + ".xml"),
-                                               document);
-    }
-    std::vector<std::u16string> Names() const {
-        std::vector<std::u16string> names;
-        manager->GetWorkspaces(names);
-        return names;
-    }
-    std::vector<std::u16string> FilesIn(std::u16string const& folder) const {
-        std::vector<std::u16string> files;
-        FileUtils::ContainedFiles(folder, files);
-        return files;
-    }
-    std::vector<std::string> FrameTypes() const {
-        std::vector<std::string> types;
-        for (unsigned long f = 0; f < main->GetFrameCount(); ++f) {
-            types.push_back(main->GetFrame(f)->GetFrontTabPanel()->GetTabType());
-        }
-        return types;
-    }
-
-    TempDir prefs;
-    std::u16string saved, archived, settings;
-    std::unique_ptr<Manager> manager;
-};
-
-} // namespace
 
 TEST_F(ManagerStories, TheFoldersLiveInThePreferencesFolder) {
     EXPECT_TRUE(FileUtils::DirectoryExists(saved));

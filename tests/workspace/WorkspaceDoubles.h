@@ -122,6 +122,9 @@ public:
     void NotifyTabDragEnd(TabPanel* panel) override { log.push_back("tab end " + panel->GetTabType()); }
     void NotifySplitterDragBegin(TopLevelWindow*) override { log.push_back("bar begin"); }
     void NotifySplitterDragEnd(TopLevelWindow*) override { log.push_back("bar end"); }
+    void DoWorkspaceCmdNew() override { log.push_back("command new"); }
+    void DoWorkspaceCmdDelete() override { log.push_back("command delete"); }
+    void DoWorkspaceCmdReset() override { log.push_back("command reset"); }
     std::vector<std::string> log;
 };
 
