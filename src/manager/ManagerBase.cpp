@@ -43,6 +43,16 @@ std::u16string Localized(std::string const& key) {
     return orvcore::config::Localizer::Get().Localize(key);
 }
 
+// The list under the key as stored when it has the kind asked for, else a converted copy in copy.
+template <typename T>
+std::vector<T> const& ListOf(PropList const& list, std::string const& key, std::vector<T>& copy) {
+    if (auto const* stored = list.Peek<std::vector<T>>(key)) {
+        return *stored;
+    }
+    list.GetValue(key, copy);
+    return copy;
+}
+
 std::u16string FileNameOf(std::u16string const& path) {
     return orvcore::filesupport::File(path).GetName();
 }
@@ -103,13 +113,15 @@ void ManagerBase::ReadSettingsCache(PropList const& settings, bool haveSettings)
     if (version != ConfigVersion) {
         return;
     }
-    std::vector<std::string> times;
-    std::vector<std::u16string> paths, names;
-    std::vector<std::int32_t> types;
-    settings.GetValue("ModifiedTimes", times);
-    settings.GetValue("FilePaths", paths);
-    settings.GetValue("UserNames", names);
-    settings.GetValue("WorkspaceTypes", types);
+    // The lists are read where they lie when they have the kinds written here; a document written
+    // otherwise (texts stored as UTF-8, say) is read through copies.
+    std::vector<std::string> timesCopy;
+    std::vector<std::u16string> pathsCopy, namesCopy;
+    std::vector<std::int32_t> typesCopy;
+    auto const& times = ListOf(settings, "ModifiedTimes", timesCopy);
+    auto const& paths = ListOf(settings, "FilePaths", pathsCopy);
+    auto const& names = ListOf(settings, "UserNames", namesCopy);
+    auto const& types = ListOf(settings, "WorkspaceTypes", typesCopy);
     if (paths.size() != times.size() || names.size() != times.size() || types.size() != times.size()) {
         return; // records that do not line up are no records
     }
@@ -295,9 +307,16 @@ void ManagerBase::AddMenuHelper(MenuHelperBase* helper) {
         return;
     }
     helpers_.push_back(helper);
-    helper->RebuildMenu();
-    if (!current_.empty()) {
-        helper->NewActiveWorkspace(current_);
+    try {
+        helper->RebuildMenu();
+        if (!current_.empty()) {
+            helper->NewActiveWorkspace(current_);
+        }
+    } catch (...) {
+        // A helper that fails its first rebuild (its constructor then throws, so nothing will ever
+        // remove it) must not stay listed.
+        RemoveMenuHelper(helper);
+        throw;
     }
 }
 

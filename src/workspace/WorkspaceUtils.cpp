@@ -35,8 +35,13 @@ struct AssertingCreation {
     Workspace& workspace;
 };
 
-std::vector<TopLevelWindow*> Windows(Workspace const& workspace) {
-    std::vector<TopLevelWindow*> windows;
+// The walk holds what it visits: a visitor or a toggle may close a panel, and with it an emptied
+// frame or floating window, while the walk still has them in its list.
+using WindowList = std::vector<boost::intrusive_ptr<TopLevelWindow>>;
+using FrameList = std::vector<boost::intrusive_ptr<WorkspaceFrame>>;
+
+WindowList Windows(Workspace const& workspace) {
+    WindowList windows;
     for (std::size_t w = 0; w < workspace.ChildSize(); ++w) {
         if (auto* window = dynamic_cast<TopLevelWindow*>(workspace.ChildGet(w))) {
             windows.push_back(window);
@@ -45,8 +50,8 @@ std::vector<TopLevelWindow*> Windows(Workspace const& workspace) {
     return windows;
 }
 
-std::vector<WorkspaceFrame*> Frames(TopLevelWindow const& window) {
-    std::vector<WorkspaceFrame*> frames;
+FrameList Frames(TopLevelWindow const& window) {
+    FrameList frames;
     for (std::size_t f = 0; f < window.ChildSize(); ++f) {
         if (auto* frame = dynamic_cast<WorkspaceFrame*>(window.ChildGet(f))) {
             frames.push_back(frame);
@@ -57,9 +62,9 @@ std::vector<WorkspaceFrame*> Frames(TopLevelWindow const& window) {
 
 // Calls visit(frame, index, panel) for each tab of the window until it returns false.
 template <typename Visit> bool WalkWindow(TopLevelWindow const& window, Visit&& visit) {
-    for (WorkspaceFrame* frame : Frames(window)) {
+    for (auto const& frame : Frames(window)) {
         for (long i = 0; i < frame->GetTabCount(); ++i) {
-            if (TabPanel* panel = frame->GetTabPanel(i); panel && !visit(frame, i, panel)) {
+            if (TabPanel* panel = frame->GetTabPanel(i); panel && !visit(frame.get(), i, panel)) {
                 return false;
             }
         }
@@ -67,14 +72,18 @@ template <typename Visit> bool WalkWindow(TopLevelWindow const& window, Visit&& 
     return true;
 }
 
-template <typename Visit> bool Walk(Workspace const& workspace, Visit&& visit) {
-    WalkLock lock(TabWalkLock());
-    for (TopLevelWindow* window : Windows(workspace)) {
+template <typename Visit> bool WalkUnlocked(Workspace const& workspace, Visit&& visit) {
+    for (auto const& window : Windows(workspace)) {
         if (!WalkWindow(*window, visit)) {
             return false;
         }
     }
     return true;
+}
+
+template <typename Visit> bool Walk(Workspace const& workspace, Visit&& visit) {
+    WalkLock lock(TabWalkLock());
+    return WalkUnlocked(workspace, std::forward<Visit>(visit));
 }
 
 struct Found {
@@ -96,9 +105,9 @@ Found FirstOfTypeIn(TopLevelWindow const& window, std::string const& tabType) {
 }
 
 WorkspaceFrame* FrameToReanimate(TopLevelWindow const& window, std::string const& tabType) {
-    for (WorkspaceFrame* frame : Frames(window)) {
+    for (auto const& frame : Frames(window)) {
         if (frame->CanReanimateTab(tabType)) {
-            return frame;
+            return frame.get();
         }
     }
     return nullptr;
@@ -196,9 +205,9 @@ TopLevelWindow* FindTopLevelWindowFromID(Workspace const& workspace, std::string
         return nullptr;
     }
     WalkLock lock(TabWalkLock());
-    for (TopLevelWindow* window : Windows(workspace)) {
+    for (auto const& window : Windows(workspace)) {
         if (window->UI_GetNodeID() == id) {
-            return window;
+            return window.get();
         }
     }
     return nullptr;
@@ -263,7 +272,7 @@ bool TabIsShownInTLW(TopLevelWindow const& window, TabPanel const& tab, bool& fr
 bool TabIsShown(Workspace const& workspace, std::string const& tabType, bool& front) {
     WalkLock lock(TabWalkLock());
     front = false;
-    for (TopLevelWindow* window : Windows(workspace)) {
+    for (auto const& window : Windows(workspace)) {
         Found found = FirstOfTypeIn(*window, tabType);
         if (found.panel && TabIsShownInTLW(*window, *found.panel, front, true)) {
             return true;
@@ -277,7 +286,7 @@ bool TabIsShown(Workspace const& workspace, boost::intrusive_ptr<TabPanel> const
     if (!tab) {
         return false;
     }
-    for (TopLevelWindow* window : Windows(workspace)) {
+    for (auto const& window : Windows(workspace)) {
         if (TabIsShownInTLW(*window, *tab, front, true)) {
             return true;
         }
@@ -293,21 +302,21 @@ void ToggleTabState(Workspace& workspace, boost::intrusive_ptr<TabPanel> tab, bo
     }
     AssertingCreation asserting(workspace);
     WalkLock lock(TabWalkLock());
-    std::vector<TopLevelWindow*> windows = Windows(workspace);
+    WindowList windows = Windows(workspace);
     bool front = false;
     bool shown = std::any_of(windows.begin(), windows.end(),
-                             [&](TopLevelWindow* w) { return TabIsShownInTLW(*w, *tab, front, false); });
+                             [&](auto const& w) { return TabIsShownInTLW(*w, *tab, front, false); });
     if (!shown) {
         // Back where it was last: its frame, a frame of its window, its closed window, or a new one.
-        for (TopLevelWindow* window : windows) {
-            for (WorkspaceFrame* frame : Frames(*window)) {
+        for (auto const& window : windows) {
+            for (auto const& frame : Frames(*window)) {
                 if (frame->CanReanimateTab(tab.get())) {
                     frame->ReanimateTab(tab);
                     return;
                 }
             }
         }
-        for (TopLevelWindow* window : windows) {
+        for (auto const& window : windows) {
             if (window->CanReanimateFrame(tab) && window->ReanimateFrame(tab)) {
                 return;
             }
@@ -330,14 +339,23 @@ void ToggleTabState(Workspace& workspace, boost::intrusive_ptr<TabPanel> tab, bo
         window->GetLayoutManager()->SetMaximizedFrame(nullptr);
         return;
     }
-    CloseOrBringForward(workspace, Found{frame, frame->IndexOf(tab.get()), tab.get()}, focusFirst);
+    if (frame->GetFrontTabPanel() == tab.get()) {
+        if (focusFirst && workspace.GetFocusedTabPanel() != tab.get()) {
+            workspace.SetFocusedTabPanel(tab.get());
+        } else {
+            workspace.RemoveTab(frame, tab.get(), true, true);
+        }
+    } else {
+        frame->BringTabToFront(tab.get());
+        workspace.SetFocusedTabPanel(tab.get());
+    }
 }
 
 void ToggleTabState(Workspace& workspace, std::string const& tabType, bool focusFirst) {
     WalkLock lock(TabWalkLock());
     WorkspaceFrame* frameToReanimate = nullptr;
     TopLevelWindow* windowToReanimate = nullptr;
-    for (TopLevelWindow* window : Windows(workspace)) {
+    for (auto const& window : Windows(workspace)) {
         Found found = FirstOfTypeIn(*window, tabType);
         if (found.panel) {
             if (Frame* maximized = window->GetLayoutManager()->GetMaximizedFrame();
@@ -354,7 +372,7 @@ void ToggleTabState(Workspace& workspace, std::string const& tabType, bool focus
             frameToReanimate = FrameToReanimate(*window, tabType);
         }
         if (!windowToReanimate && window->CanReanimateFrame(tabType)) {
-            windowToReanimate = window;
+            windowToReanimate = window.get();
         }
     }
     if (frameToReanimate) {
@@ -378,7 +396,7 @@ void ToggleToolbarTabState(Workspace& workspace, std::string const& tabType) {
         main->RemoveStaticElement(LayoutManager::Top, true);
         return;
     }
-    for (TopLevelWindow* window : Windows(workspace)) {
+    for (auto const& window : Windows(workspace)) {
         Found found = FirstOfTypeIn(*window, tabType);
         if (found.panel) {
             CloseOrBringForward(workspace, found, false);
@@ -392,10 +410,9 @@ void ToggleToolbarTabState(Workspace& workspace, std::string const& tabType) {
             return;
         }
     }
-    if (workspace.CanReanimateWindow(tabType) && workspace.ReanimateWindow(tabType)) {
-        return;
-    }
-    if (main) {
+    if (workspace.CanReanimateWindow(tabType)) {
+        workspace.ReanimateWindow(tabType);
+    } else if (main) {
         main->SetStaticElement(tabType, LayoutManager::Top, true);
     }
 }
@@ -415,7 +432,7 @@ void ToggleStatusbarTabState(Workspace& workspace, std::string const& tabType) {
 
 TabPanel* CreateOrReanimateTab(Workspace& workspace, std::string const& tabType) {
     WalkLock lock(TabWalkLock());
-    for (TopLevelWindow* window : Windows(workspace)) {
+    for (auto const& window : Windows(workspace)) {
         if (WorkspaceFrame* frame = FrameToReanimate(*window, tabType)) {
             frame->ReanimateTab(tabType);
             return FirstOfTypeIn(*window, tabType).panel;
@@ -476,7 +493,7 @@ bool ToggleFrameMaximizationState(Workspace& workspace) {
 
 bool ChangeFocusTabPanel(Workspace& workspace, bool forward) {
     std::vector<TabPanel*> tabs;
-    Walk(workspace, [&](WorkspaceFrame*, long, TabPanel* panel) {
+    WalkUnlocked(workspace, [&](WorkspaceFrame*, long, TabPanel* panel) {
         tabs.push_back(panel);
         return true;
     });

@@ -2,6 +2,7 @@
 // and clicking, and the workspaces drop-down driven by clicks on the control.
 #include "manager/ManagerStories.h"
 
+#include "host/core/Error.h"
 #include "host/core/StringUtils.h"
 #include "host/ui/Dialogs.h"
 #include "host/ui/Menu.h"
@@ -43,6 +44,17 @@ std::u16string Message(UI_ModalWindow& modal) {
     auto* text = dynamic_cast<orvui::controls::UI_StaticText*>(modal.UI_FindNodeByID("Message"));
     return text ? text->GetText() : std::u16string();
 }
+
+// A popup whose changed notification a test can send as the control would, for items (the empty
+// one) that a click cannot choose.
+class NotifiedPopup : public orvworkspace::sharedui::WorkspacesPopup {
+public:
+    using WorkspacesPopup::WorkspacesPopup;
+    void Choose(long index) {
+        SetValue(index);
+        SendChanged(index);
+    }
+};
 
 class Chooser : public ManagerStories {
 protected:
@@ -201,8 +213,16 @@ TEST_F(Chooser, DeletingOffersEveryWorkspaceButTheCurrentOne) {
 
 TEST_F(Chooser, ResetAsksWithTheCurrentNameAndRevertsOnlyWhenConfirmed) {
     Start();
-    EXPECT_FALSE(
-        dialogs::ConfirmRevertCurrWorkspace(nullptr, main, *manager)); // nothing current: no question
+    {
+        // Nothing current: no question at all.
+        int turns = 0;
+        ScopedModalDriver driver([&](UI_ModalWindow& m) {
+            ++turns;
+            m.EndModal(int(orvui::ui::ButtonOK));
+        });
+        EXPECT_FALSE(dialogs::ConfirmRevertCurrWorkspace(nullptr, main, *manager));
+        EXPECT_EQ(turns, 0);
+    }
     BuildTwoFrames();
     manager->CreateUserWorkspace(u"Grading");
     main->RemoveFrame(right, false);
@@ -247,9 +267,8 @@ TEST_F(Chooser, ThePopupListsTheNamesChecksTheCurrentOneAndOffersTheCommands) {
     EXPECT_EQ(Checked(*popup), 0);
     EXPECT_EQ(popup->GetValue(), 0);
 
-    // The commands call the host once each and put the selection back on the current workspace;
-    // the empty item only puts the selection back.
-    for (long item : {3L, 4L, 5L, 2L}) {
+    // The commands call the host once each and put the selection back on the current workspace.
+    for (long item : {3L, 4L, 5L}) {
         Pick(*popup, item);
         EXPECT_EQ(Checked(*popup), 0);
         EXPECT_EQ(popup->GetValue(), 0);
@@ -272,6 +291,33 @@ TEST_F(Chooser, ThePopupListsTheNamesChecksTheCurrentOneAndOffersTheCommands) {
     popup.reset();
     manager->SetCurrentWorkspace(u"beta");
     EXPECT_EQ(manager->GetCurrentWorkspace(), u"beta");
+}
+
+TEST_F(Chooser, TheEmptyItemOnlyPutsTheSelectionBack) {
+    Start();
+    manager->CreateUserWorkspace(u"beta");
+    manager->CreateUserWorkspace(u"Alpha");
+    auto popup = Place(new NotifiedPopup(*manager));
+    ASSERT_EQ(popup->GetItems()[2].text, u"");
+    popup->Choose(2);
+    EXPECT_EQ(popup->GetValue(), 0);
+    EXPECT_EQ(Checked(*popup), 0);
+    EXPECT_TRUE(Commands().empty());
+    EXPECT_EQ(manager->GetCurrentWorkspace(), u"Alpha");
+    main->ChildRemove(popup.get());
+    // The default workspace answers the commands with nothing.
+    boost::intrusive_ptr<orvworkspace::workspace::Workspace> plain(new orvworkspace::workspace::Workspace);
+    plain->DoWorkspaceCmdNew();
+    plain->DoWorkspaceCmdDelete();
+    plain->DoWorkspaceCmdReset();
+}
+
+TEST_F(Chooser, APopupMadeBeforeStartUpIsRefusedAndNotKept) {
+    Manager early(*workspace, saved, archived, settings, nullptr, nullptr, false);
+    EXPECT_THROW(orvworkspace::sharedui::WorkspacesPopup popup(early), orvcore::config::Error);
+    early.Initialize();
+    early.CreateUserWorkspace(u"Later"); // tells its helpers: none may be left over
+    EXPECT_EQ(early.GetCurrentWorkspace(), u"Later");
 }
 
 TEST_F(Chooser, ASingleCurrentWorkspaceCannotBeDeleted) {

@@ -2,6 +2,7 @@
 // closed and back into their remembered places, the bars, maximising frames and cycling the focus.
 #include "workspace/WorkspaceDoubles.h"
 
+#include "host/ui/Dialogs.h"
 #include "workspace/WorkspaceUtils.h"
 
 #include <list>
@@ -59,9 +60,11 @@ TEST_F(WorkspaceUtilsTest, SearchesFollowTheWalkAndReportIndicesWithinTheFrame) 
     EXPECT_EQ(Walked(), (std::vector<TabPanel*>{left->GetTabPanel(0), right->GetTabPanel(0), Mixer(),
                                                 floating->GetFrame(0)->GetTabPanel(0)}));
 
-    // Node IDs: an empty one finds nothing even though every other panel has an empty ID.
+    // Node IDs: an empty one finds nothing even where a panel and a window have an empty ID.
     Mixer()->UI_SetNodeID("mixer-1");
     floating->UI_SetNodeID("floater");
+    left->GetTabPanel(0)->UI_SetNodeID("");
+    main->UI_SetNodeID("");
     EXPECT_EQ(utils::FindTabFromID(*workspace, "mixer-1"), Mixer());
     EXPECT_EQ(utils::FindTabFromID(*main, "mixer-1"), Mixer());
     EXPECT_EQ(utils::FindTabFromID(*floating, "mixer-1"), nullptr);
@@ -71,9 +74,27 @@ TEST_F(WorkspaceUtilsTest, SearchesFollowTheWalkAndReportIndicesWithinTheFrame) 
     EXPECT_EQ(utils::FindTabFromTabPanelID(*workspace, Mixer()->GetID()), Mixer());
     EXPECT_EQ(utils::FindTabFromTabPanelID(*workspace, 999999), nullptr);
 
+    // A bar's panel is never found, by ID or by number either.
+    TabPanel* bar = main->GetStaticElement(LayoutManager::Bottom);
+    bar->UI_SetNodeID("bar");
+    EXPECT_EQ(utils::FindTabFromID(*workspace, "bar"), nullptr);
+    EXPECT_EQ(utils::FindTabFromTabPanelID(*workspace, bar->GetID()), nullptr);
+
     EXPECT_EQ(utils::FindMainTopLevelWindow(), main);
     EXPECT_EQ(utils::GetModalDialogParentNode(), main);
     EXPECT_EQ(utils::GetModalDialogParent(), appWindow);
+    // While a modal window runs, dialogs are modal to it.
+    orvui::ui::OS_Window* parentInside = nullptr;
+    {
+        orvui::ui::ScopedModalDriver driver([&](orvui::ui::UI_ModalWindow& modal) {
+            parentInside = utils::GetModalDialogParentNode();
+            EXPECT_EQ(utils::GetModalDialogParent(), modal.GetPlatformWindow());
+            modal.EndModal(1);
+        });
+        orvui::ui::messagebox::ShowNote(nullptr, u"Note", u"text", main);
+    }
+    EXPECT_NE(parentInside, nullptr);
+    EXPECT_NE(parentInside, main);
 }
 
 TEST_F(WorkspaceUtilsTest, AVisitorThatStopsSeesNoMoreAndMaySearchAgainInside) {
@@ -273,7 +294,10 @@ TEST_F(WorkspaceUtilsTest, FocusCyclesThroughEveryPanelAndWraps) {
     TabPanel* bar = main->SetStaticElement("browser", LayoutManager::Bottom, true);
     workspace->SetFocusedTabPanel(bar);
     ASSERT_EQ(workspace->GetFocusedTabPanel(), bar);
-    ASSERT_TRUE(utils::ChangeFocusTabPanel(*workspace, false)); // from outside the list: the last
+    ASSERT_TRUE(utils::ChangeFocusTabPanel(*workspace, true)); // from outside the list: the first
+    EXPECT_EQ(workspace->GetFocusedTabPanel(), tabs[0]);
+    workspace->SetFocusedTabPanel(bar);
+    ASSERT_TRUE(utils::ChangeFocusTabPanel(*workspace, false)); // or the last
     EXPECT_EQ(workspace->GetFocusedTabPanel(), tabs[3]);
     ASSERT_TRUE(utils::ChangeFocusTabPanel(*workspace, true)); // from the last to the first
     EXPECT_EQ(workspace->GetFocusedTabPanel(), tabs[0]);

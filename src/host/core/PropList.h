@@ -90,6 +90,13 @@ public:
     // returned list is owned by this one and lives until its pair is replaced or removed.
     PropList* NewSubList(std::string const& key);
 
+    // The stored value itself when the key holds exactly a T (a list of texts, say), else null: a
+    // reader of a long list spares copying it. Valid until the pair is changed.
+    template <typename T> T const* Peek(std::string const& key) const {
+        Value const* v = Find(key);
+        return v ? std::get_if<T>(v) : nullptr;
+    }
+
     // Removes the pair; false when there was none.
     bool RemoveValue(std::string const& key);
     bool IsEmpty() const { return entries_.empty(); }
