@@ -38,7 +38,8 @@ protected:
         std::filesystem::create_directories(out.Path() / "prefs");
         orvtest::DesktopScenario::SetUp();
         orvui::ui::Desktop::Get().SetMonitors({orvdemo::DemoApp::Monitor});
-        app = std::make_unique<orvdemo::DemoApp>(u"", u"Editing");
+        std::string shipped = ORVDEMO_WORKSPACES_DIR;
+        app = std::make_unique<orvdemo::DemoApp>(std::u16string(shipped.begin(), shipped.end()), u"Editing");
     }
     void CloseWindows() override { app.reset(); }
     void TearDown() override {
@@ -137,4 +138,17 @@ TEST_F(DemoTour, ABadLineIsReportedWithItsNumberAndChangesNothing) {
     }
     EXPECT_EQ(Shape(), std::make_pair(6ul, std::size_t(1)));
     EXPECT_EQ(tour.GetSnapshots().size(), 2u); // the start and the one good step
+}
+
+TEST_F(DemoTour, TheShippedWorkspaceIsOfferedAndCopiedWhenChosen) {
+    std::vector<std::u16string> names;
+    app->GetManager().GetWorkspaces(names);
+    EXPECT_EQ(names, (std::vector<std::u16string>{u"Audio", u"Color", u"Editing", u"Effects", u"Review"}));
+    ASSERT_TRUE(app->GetManager().SetCurrentWorkspace(u"Review"));
+    // Its floating meters come with it; the user's copy is made, the shipped file left alone.
+    EXPECT_EQ(Shape(), std::make_pair(5ul, std::size_t(2)));
+    EXPECT_TRUE(app->GetManager().GetWorkspaceTable().count(u"Review"));
+    std::u16string path = app->GetManager().GetWorkspaceTable().at(u"Review")->GetFilePath();
+    std::string shipped = ORVDEMO_WORKSPACES_DIR;
+    EXPECT_EQ(std::string(path.begin(), path.end()).rfind(shipped, 0), std::string::npos);
 }
