@@ -6,6 +6,7 @@
 #include "manager/WorkspaceDirs.h"
 #include "persistence/WorkspaceBuilder.h"
 #include "workspace/TopLevelWindow.h"
+#include "workspace/WorkspaceUtils.h"
 
 namespace orvdemo {
 
@@ -84,11 +85,18 @@ std::unique_ptr<WorkspaceBuilder> BuiltInWorkspaces::CreateWorkspaceBuilder(std:
 
 // --- The application ---
 
+namespace {
+// The running application, for the main window's message hook (a plain function).
+DemoApp* running = nullptr;
+} // namespace
+
 DemoApp::DemoApp(std::u16string const& systemFolder, std::u16string const& firstWorkspace)
     : shipped_(systemFolder) {
     namespace style = orvui::ui::style;
     appWindow_ = Desktop::Get().CreateNativeWindow(
-        u"orvdemo", style::Popup | style::Caption | style::SizingFrame | style::Visible, 0, 0, MainRect);
+        u"orvdemo", style::Popup | style::Caption | style::SizingFrame | style::Visible, 0, 0, MainRect,
+        nullptr, true);
+    Desktop::Get().SetMenuBar(appWindow_, {u"Window"});
     workspace_ = new DemoWorkspace;
     RegisterPanelCreators(*workspace_);
     workspace_->AttachToClientApp(nullptr, nullptr, appWindow_, nullptr, false);
@@ -98,15 +106,81 @@ DemoApp::DemoApp(std::u16string const& systemFolder, std::u16string const& first
                                          systemFolder.empty() ? nullptr : &shipped_, false);
     workspace_->SetManager(manager_.get());
     manager_->Initialize();
+    // The host's items; the helper puts the workspaces above them.
+    windowMenu_.AppendItem(u"New Workspace...", NewWorkspace);
+    windowMenu_.AppendItem(u"Delete Workspace...", DeleteWorkspace);
+    windowMenu_.AppendItem(u"Reset Workspace...", ResetWorkspace);
+    windowMenu_.AppendSeparator();
+    for (std::size_t i = 0; i < PanelTypes().size(); ++i) {
+        windowMenu_.AppendItem(PanelName(PanelTypes()[i]), FirstPanel + i);
+    }
+    menuHelper_ = PlatformMenuHelperBase::NewPlatformMenuHelper(&windowMenu_, *manager_, {1000, 1999}, false);
+    manager_->AddMenuHelper(menuHelper_.get());
     manager_->SetCurrentWorkspace(firstWorkspace);
+    running = this;
+    workspace_->GetMainTopLevelWindow()->UI_SetEventFunction(&DemoApp::OnWindowMessage);
+}
+
+void DemoApp::OnWindowMessage(orvui::ui::OS_Event* event) {
+    if (running && event->message == orvui::ui::message::MenuBarPressed && event->wParam == 0) {
+        running->OpenWindowMenu();
+    }
+}
+
+orvui::utility::OS_Menu& DemoApp::GetWindowMenu() {
+    // The panel items are checked while a panel of the kind shows.
+    for (std::size_t i = 0; i < PanelTypes().size(); ++i) {
+        bool front = false;
+        windowMenu_.CheckItem(FirstPanel + i,
+                              WorkspaceUtils::TabIsShown(*workspace_, PanelTypes()[i], front));
+    }
+    return windowMenu_;
+}
+
+void DemoApp::OpenWindowMenu() {
+    unsigned long command = orvui::utility::UI_DoPopupMenu(
+        GetWindowMenu(), Desktop::Get().GetMenuBarItemRect(appWindow_, 0), appWindow_);
+    if (command) {
+        HandleCommand(command);
+    }
+}
+
+bool DemoApp::HandleCommand(unsigned long command) {
+    if (menuHelper_->HandleCommand(command)) {
+        return true;
+    }
+    switch (command) {
+    case NewWorkspace:
+        workspace_->DoWorkspaceCmdNew();
+        return true;
+    case DeleteWorkspace:
+        workspace_->DoWorkspaceCmdDelete();
+        return true;
+    case ResetWorkspace:
+        workspace_->DoWorkspaceCmdReset();
+        return true;
+    default:
+        break;
+    }
+    if (command >= FirstPanel && command < FirstPanel + PanelTypes().size()) {
+        WorkspaceUtils::ToggleTabState(*workspace_, PanelTypes()[command - FirstPanel], false);
+        return true;
+    }
+    return false;
 }
 
 DemoApp::~DemoApp() {
+    running = nullptr;
+    if (TopLevelWindow* main = workspace_->GetMainTopLevelWindow()) {
+        main->UI_SetEventFunction(nullptr);
+    }
     if (manager_->HasCurrentWorkspace()) {
         manager_->SaveWorkspace(manager_->GetCurrentWorkspace());
     }
     manager_->FlushManagerSettings();
     workspace_->SetManager(nullptr);
+    manager_->RemoveMenuHelper(menuHelper_.get());
+    menuHelper_.reset();
     manager_.reset();
     workspace_.reset();
     Desktop::Get().DestroyNativeWindow(appWindow_);

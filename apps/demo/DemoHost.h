@@ -5,8 +5,10 @@
 // workspace saved and the manager's settings flushed.
 #pragma once
 
+#include "host/ui/Menu.h"
 #include "host/ui/UITypes.h"
 #include "manager/Manager.h"
+#include "manager/PlatformMenuHelperBase.h"
 #include "manager/WorkspaceProviders.h"
 #include "workspace/Workspace.h"
 
@@ -65,16 +67,34 @@ public:
     DemoApp(DemoApp const&) = delete;
     DemoApp& operator=(DemoApp const&) = delete;
 
+    // The main window's Window menu: the workspaces (kept by a menu helper), then new, delete and
+    // reset, then one item per panel kind, checked while it is shown.
+    enum Command : unsigned long {
+        NewWorkspace = 1,
+        DeleteWorkspace = 2,
+        ResetWorkspace = 3,
+        FirstPanel = 100, // one per panel kind, in the order of PanelTypes
+    };
+    orvui::utility::OS_Menu& GetWindowMenu();
+    // Opens the Window menu under its title in the menu bar and carries out the choice.
+    void OpenWindowMenu();
+    // Carries out a command of the Window menu; false for one it does not know.
+    bool HandleCommand(unsigned long command);
+
     DemoWorkspace& GetWorkspace() const { return *workspace_; }
     orvworkspace::workspace::Manager& GetManager() const { return *manager_; }
     orvui::ui::NativeWindow GetAppWindow() const { return appWindow_; }
 
 private:
+    static void OnWindowMessage(orvui::ui::OS_Event* event);
+
     orvui::ui::NativeWindow appWindow_ = 0;
     boost::intrusive_ptr<DemoWorkspace> workspace_;
     BuiltInWorkspaces builtIns_{MainRect};
     ShippedWorkspaces shipped_;
     std::unique_ptr<orvworkspace::workspace::Manager> manager_;
+    orvui::utility::OS_Menu windowMenu_;
+    std::unique_ptr<orvworkspace::workspace::PlatformMenuHelperBase> menuHelper_;
 };
 
 } // namespace orvdemo

@@ -5,6 +5,8 @@
 #include "host/core/PropListUtils.h"
 #include "host/core/TextConversion.h"
 #include "host/ui/Desktop.h"
+#include "host/ui/Menu.h"
+#include "host/ui/Modal.h"
 #include "host/ui/controls/TabWell.h"
 #include "layout/DropZone.h"
 #include "layout/Frame.h"
@@ -157,10 +159,10 @@ char const* Tour::BuiltInScript() {
            "maximize timeline\n"
            "maximize timeline\n"
            "# Close the meters from the Window menu and bring them back in their place.\n"
-           "toggle meters\n"
-           "toggle meters\n"
+           "menu Audio Meters\n"
+           "menu Audio Meters\n"
            "new My Edit\n"
-           "switch Color\n"
+           "menu Color\n"
            "switch My Edit\n"
            "reset\n";
 }
@@ -235,6 +237,44 @@ void Tour::Run(std::string const& line) {
             throw TourError("no current workspace to reset");
         }
         manager.RevertWorkspace(manager.GetCurrentWorkspace());
+    } else if (command == "menu") {
+        // A press on the menu bar's Window title, then a click on the item, as a hand would.
+        std::u16string item = orvcore::utility::UTF8to16(Rest(line, command));
+        bool found = false;
+        bool opened = false;
+        std::string offered;
+        {
+            orvui::ui::ScopedModalDriver driver([&](orvui::ui::UI_ModalWindow& modal) {
+                if (opened) {
+                    return; // a dialog the item opened: nobody answers, so it is cancelled
+                }
+                opened = true;
+                auto* menu = dynamic_cast<orvui::utility::MenuWindow*>(&modal);
+                for (std::size_t i = 0; menu && i < menu->GetMenu().GetItemCount(); ++i) {
+                    if (!menu->GetMenu().GetItem(i).separator) {
+                        offered += (offered.empty() ? "" : ", ") +
+                                   orvcore::utility::UTF16to8(menu->GetMenu().GetItem(i).text);
+                    }
+                    if (menu->GetMenu().GetItem(i).text == item) {
+                        found = true;
+                        PointT on = Middle(menu->GetItemGlobalRect(i));
+                        Desktop::Get().MouseMove(on);
+                        Desktop::Get().MouseDown(on);
+                        Desktop::Get().MouseUp(on);
+                        return;
+                    }
+                }
+                modal.CancelModal();
+            });
+            PointT title = Middle(Desktop::Get().GetMenuBarItemRect(app_.GetAppWindow(), 0));
+            Desktop::Get().MouseMove(title);
+            Desktop::Get().MouseDown(title);
+            Desktop::Get().MouseUp(title);
+        }
+        if (!found) {
+            throw TourError("the Window menu has no item '" + Rest(line, command) + "' (it offers " +
+                            (offered.empty() ? std::string("nothing") : offered) + ")");
+        }
     } else if (command == "snapshot") {
         need(2, "snapshot NAME");
         Snapshot(w[1]);

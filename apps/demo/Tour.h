@@ -10,6 +10,8 @@
 //   maximize TYPE          maximise the frame showing the type, or restore the layout when one
 //                          is maximised (the pointer is moved over it first)
 //   toggle TYPE            the Window-menu item of a panel type: close it, or bring it back
+//   menu ITEM              open the Window menu on the menu bar and click the item of that text
+//                          (a workspace, a panel kind; a dialog it opens goes unanswered)
 //   new NAME               keep the arrangement as a new user workspace
 //   reset                  reset the current workspace to its original layout
 //   snapshot NAME          an extra snapshot under that name

@@ -68,10 +68,10 @@ TEST_F(DemoTour, EveryStepDoesWhatItSaysAndLeavesASnapshot) {
         {"drag info onto timeline bottom", {7, 1}},
         {"maximize timeline", {7, 1}},
         {"maximize timeline", {7, 1}},
-        {"toggle meters", {6, 1}},
-        {"toggle meters", {7, 1}},
+        {"menu Audio Meters", {6, 1}},
+        {"menu Audio Meters", {7, 1}},
         {"new My Edit", {7, 1}},
-        {"switch Color", {3, 1}},
+        {"menu Color", {3, 1}},
         {"switch My Edit", {7, 1}},
         {"reset", {7, 1}},
     };
@@ -151,4 +151,31 @@ TEST_F(DemoTour, TheShippedWorkspaceIsOfferedAndCopiedWhenChosen) {
     std::u16string path = app->GetManager().GetWorkspaceTable().at(u"Review")->GetFilePath();
     std::string shipped = ORVDEMO_WORKSPACES_DIR;
     EXPECT_EQ(std::string(path.begin(), path.end()).rfind(shipped, 0), std::string::npos);
+}
+
+TEST_F(DemoTour, TheWindowMenuListsTheWorkspacesAboveTheHostsItemsWithCheckMarks) {
+    auto const& menu = app->GetWindowMenu();
+    std::vector<std::u16string> texts;
+    for (auto const& item : menu.Items()) {
+        texts.push_back(item.separator ? u"-" : item.text);
+    }
+    std::vector<std::u16string> top(texts.begin(), texts.begin() + 6);
+    EXPECT_EQ(top,
+              (std::vector<std::u16string>{u"Audio", u"Color", u"Editing", u"Effects", u"Review", u"-"}));
+    auto checked = [&](std::u16string const& text) {
+        for (auto const& item : menu.Items()) {
+            if (item.text == text) {
+                return item.checked;
+            }
+        }
+        ADD_FAILURE() << "no item";
+        return false;
+    };
+    EXPECT_TRUE(checked(u"Editing"));
+    EXPECT_FALSE(checked(u"Color"));
+    EXPECT_TRUE(checked(u"Timeline"));
+    EXPECT_FALSE(checked(u"History"));                                 // not in the Editing workspace
+    ASSERT_TRUE(app->HandleCommand(orvdemo::DemoApp::FirstPanel + 9)); // History
+    EXPECT_TRUE(app->GetWindowMenu().Items().at(texts.size() - 1).checked);
+    EXPECT_FALSE(app->HandleCommand(99999));
 }

@@ -1,8 +1,10 @@
 // The desktop's window table, z-order, activation, capture, chrome drags, input and time.
 #include "host/ui/Desktop.h"
 
+#include "host/core/TextConversion.h"
 #include "host/ui/NodeManager.h"
 #include "host/ui/OS_Window.h"
+#include "host/ui/canvasor/Canvasor.h"
 
 #include <algorithm>
 
@@ -698,6 +700,31 @@ void Desktop::MouseMove(PointT global) {
     SendMouse(message::MouseMove, global, buttonDown_ ? 1 : 0);
 }
 
+void Desktop::SetMenuBar(NativeWindow w, std::vector<std::u16string> titles) {
+    if (NativeWindowRecord* record = Find(w); record && record->hasMenu) {
+        record->menuTitles = std::move(titles);
+        record->dirty = true;
+    }
+}
+
+RectT Desktop::GetMenuBarItemRect(NativeWindow w, std::size_t index) const {
+    NativeWindowRecord const* record = Find(w);
+    if (!record || !record->hasMenu || index >= record->menuTitles.size()) {
+        return RectT();
+    }
+    int x = record->rect.left + BorderWidth;
+    for (std::size_t i = 0;; ++i) {
+        int width = int(canvasor::Canvasor::Measure(orvcore::utility::UTF16to8(record->menuTitles[i]),
+                                                    canvasor::Font())
+                            .width) +
+                    16;
+        if (i == index) {
+            return RectT(x, record->rect.top + BorderWidth + TitleBarHeight, width, MenuBarHeight);
+        }
+        x += width;
+    }
+}
+
 void Desktop::MouseDown(PointT global, int button, int clickCount) {
     mouse_ = global;
     buttonDown_ = true;
@@ -711,6 +738,15 @@ void Desktop::MouseDown(PointT global, int button, int clickCount) {
         Activate(top);
         if (button == 0 && StartChromeDrag(top, global)) {
             return;
+        }
+        if (NativeWindowRecord const* record = Find(top); button == 0 && record && record->hasMenu) {
+            for (std::size_t i = 0; i < record->menuTitles.size(); ++i) {
+                if (GetMenuBarItemRect(top, i).Contains(global)) {
+                    buttonDown_ = false; // the menu takes the press
+                    SendMessage(top, message::MenuBarPressed, i, 0);
+                    return;
+                }
+            }
         }
     }
     unsigned msg = button == 0 ? (clickCount >= 2 ? message::LeftButtonDoubleClick : message::LeftButtonDown)

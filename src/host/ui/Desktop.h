@@ -65,6 +65,8 @@ struct NativeWindowRecord {
     bool enabled = true;
     float opacity = 1.0f;
     bool hasMenu = false;
+    // The titles of the menu bar, left to right (windows made with a menu).
+    std::vector<std::u16string> menuTitles;
     bool captionActive = false;
     // The whole window needs painting; otherwise dirtyArea (window coordinates) is what does.
     bool dirty = true;
@@ -195,6 +197,11 @@ public:
     void Beep(unsigned type = 0);
     int GetBeepCount() const { return beeps_; }
     int GetMenuBarMetric() const { return MenuBarHeight; }
+    // The titles of a window's menu bar (a window made with a menu); a press on one sends the
+    // window MenuBarPressed with its index.
+    void SetMenuBar(NativeWindow w, std::vector<std::u16string> titles);
+    // A title's global rectangle in the bar; empty when there is no such title.
+    RectT GetMenuBarItemRect(NativeWindow w, std::size_t index) const;
 
     // --- Input, in global coordinates ---
     void MouseMove(PointT global);

@@ -72,6 +72,13 @@ void DrawChrome(Canvasor& c, NativeWindowRecord const& record, RectT const& clie
         c.FillRect(RectF(float(BorderWidth), float(BorderWidth + TitleBarHeight),
                          float(r.width - 2 * BorderWidth), float(MenuBarHeight)),
                    GetColor(color::MenuBar));
+        float x = float(BorderWidth);
+        for (std::u16string const& menuTitle : record.menuTitles) {
+            std::string text = orvcore::utility::UTF16to8(menuTitle);
+            c.DrawText(text, PointF(x + 8, float(BorderWidth + TitleBarHeight + 3)), canvasor::Font(),
+                       GetColor(color::TitleText));
+            x += canvasor::Canvasor::Measure(text, canvasor::Font()).width + 16;
+        }
     }
     (void)client;
 }

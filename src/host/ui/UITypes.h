@@ -46,6 +46,9 @@ inline constexpr unsigned MiddleButtonDown = 0x207;
 inline constexpr unsigned MiddleButtonUp = 0x208;
 inline constexpr unsigned MouseWheel = 0x20A;
 inline constexpr unsigned CaptureLost = 0x215;
+// A press on a title of the window's menu bar; wParam is the title's index. The window opens the
+// menu under the title's rectangle (Desktop::GetMenuBarItemRect) and acts on the choice.
+inline constexpr unsigned MenuBarPressed = 0x0116;
 } // namespace message
 
 // Modifier flags of GetCurrentModKeys.
