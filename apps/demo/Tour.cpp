@@ -99,18 +99,11 @@ PointT OnTab(TabPlace const& place) {
 }
 
 PointT InZone(DropZoneOverlayWindow const& overlay, DropZone::DropType type) {
-    for (DropZone const& zone : overlay.GetZones()) {
-        if (zone.GetType() == type) {
-            long x = 0, y = 0;
-            auto area = zone.GetArea();
-            for (PointT const& p : area) {
-                x += p.x;
-                y += p.y;
-            }
-            return PointT(std::int32_t(x / long(area.size())), std::int32_t(y / long(area.size())));
-        }
+    PointT point;
+    if (!overlay.PointInZone(type, point)) {
+        throw TourError("the frame offers no such drop zone");
     }
-    throw TourError("the frame offers no such drop zone");
+    return point;
 }
 
 // The layout trees as a Graphviz graph: splitters with their orientation, frames with their tabs.

@@ -8,6 +8,7 @@
 #include "workspace/Workspace.h"
 
 #include <algorithm>
+#include <functional>
 
 namespace orvworkspace::sharedui {
 
@@ -96,6 +97,16 @@ void SwitchTo(UI_Popup& popup, ManagerBase& manager, long chosen) {
     }
 }
 
+// What both popups do when made: the node ID, one check mark, a place among the manager's helpers
+// (which builds the items at once), and the user's choices sent to changed.
+void JoinManager(UI_Popup& popup, orvworkspace::workspace::MenuHelperBase& helper, ManagerBase& manager,
+                 std::function<void(UI_ControlChangedMessage*)> changed) {
+    popup.UI_SetNodeID("WorkspacesPopup");
+    popup.SetItemCheckStyle(true);
+    manager.AddMenuHelper(&helper);
+    popup.NotifyWhenChanged(std::move(changed));
+}
+
 } // namespace
 
 // --- WorkspacesPopup ---
@@ -103,10 +114,7 @@ void SwitchTo(UI_Popup& popup, ManagerBase& manager, long chosen) {
 WorkspacesPopup::WorkspacesPopup(ManagerBase& manager)
     : UI_Popup(0, false)
     , manager_(manager) {
-    UI_SetNodeID("WorkspacesPopup");
-    SetItemCheckStyle(true);
-    manager_.AddMenuHelper(this);
-    NotifyWhenChanged([this](UI_ControlChangedMessage* message) { PopupChanged(message); });
+    JoinManager(*this, *this, manager_, [this](UI_ControlChangedMessage* message) { PopupChanged(message); });
 }
 
 WorkspacesPopup::~WorkspacesPopup() {
@@ -158,10 +166,7 @@ WorkspacesPopup::WorkspacesPopup(ManagerBase& manager, bool withCommands)
     : UI_Popup(0, false)
     , manager_(manager)
     , withCommands_(withCommands) {
-    UI_SetNodeID("WorkspacesPopup");
-    SetItemCheckStyle(true);
-    manager_.AddMenuHelper(this);
-    NotifyWhenChanged([this](UI_ControlChangedMessage* message) { PopupChanged(message); });
+    JoinManager(*this, *this, manager_, [this](UI_ControlChangedMessage* message) { PopupChanged(message); });
 }
 
 WorkspacesPopup::~WorkspacesPopup() {

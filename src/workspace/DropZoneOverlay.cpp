@@ -76,6 +76,22 @@ DropZoneOverlayWindow::DropZoneOverlayWindow(TopLevelWindow* window, orvui::ui::
     UI_SetNodeID("DropZoneOverlayWindow");
 }
 
+bool DropZoneOverlayWindow::PointInZone(DropZone::DropType type, PointT& point) const {
+    for (DropZone const& zone : zones_) {
+        auto area = zone.GetArea();
+        if (zone.GetType() == type && !area.empty()) {
+            long x = 0, y = 0;
+            for (PointT const& p : area) {
+                x += p.x;
+                y += p.y;
+            }
+            point = PointT(std::int32_t(x / long(area.size())), std::int32_t(y / long(area.size())));
+            return true;
+        }
+    }
+    return false;
+}
+
 bool DropZoneOverlayWindow::PolygonContains(std::vector<PointT> polygon, PointT const& point) {
     polygon.erase(std::unique(polygon.begin(), polygon.end()), polygon.end());
     if (polygon.empty()) {

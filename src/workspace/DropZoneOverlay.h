@@ -62,6 +62,9 @@ public:
     std::vector<DropZone> const& GetZones() const { return zones_; }
     // The zone of the active type, or null.
     DropZone const* GetActiveZone() const;
+    // A point inside the zone of a type (the mean of its corners), for a pointer to aim at; false
+    // when the overlay offers no zone of that type.
+    bool PointInZone(DropZone::DropType type, PointT& point) const;
     void GetGlobalRect(RectT* out) const { *out = globalRect_; }
     TopLevelWindow* GetWindow() const { return window_; }
     TabDragger* GetDragger() const { return dragger_; }

@@ -53,21 +53,10 @@ protected:
     }
     TabDragger* Dragger() const { return dynamic_cast<TabDragger*>(workspace->GetTracker()); }
 
-    // A point inside the overlay's zone of a type: the average of its polygon's corners.
     static PointT InZone(DropZoneOverlayWindow* overlay, DropZone::DropType type) {
-        for (DropZone const& zone : overlay->GetZones()) {
-            if (zone.GetType() == type) {
-                long x = 0, y = 0;
-                auto area = zone.GetArea();
-                for (PointT const& p : area) {
-                    x += p.x;
-                    y += p.y;
-                }
-                return PointT(std::int32_t(x / long(area.size())), std::int32_t(y / long(area.size())));
-            }
-        }
-        ADD_FAILURE() << "no zone of type " << int(type);
-        return PointT();
+        PointT point;
+        EXPECT_TRUE(overlay->PointInZone(type, point)) << "no zone of type " << int(type);
+        return point;
     }
 
     // Drags the front tab of a frame over another frame and drops it in the zone of a type.
