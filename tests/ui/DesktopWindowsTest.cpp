@@ -271,3 +271,39 @@ TEST_F(DesktopTest, APointerCaptureGetsTheReleaseAnywhere) {
     EXPECT_EQ(log.back().substr(0, 7), "chip:2@");
     EXPECT_EQ(desktop().GetCapture(), 0u);
 }
+
+TEST_F(DesktopTest, APressOnAMenuBarTitleTellsTheWindowWhichTitle) {
+    boost::intrusive_ptr<RecordingWindow> w(new RecordingWindow);
+    w->UI_CreateWindow(u"menus", 0, RectT(100, 100, 400, 300), style::Popup | style::Caption | style::Visible,
+                       0, true);
+    desktop().SetMenuBar(w->GetPlatformWindow(), {u"File", u"Window"});
+    RectT file = desktop().GetMenuBarItemRect(w->GetPlatformWindow(), 0);
+    RectT window = desktop().GetMenuBarItemRect(w->GetPlatformWindow(), 1);
+    EXPECT_EQ(window.left, file.left + file.width); // side by side, left to right
+    EXPECT_TRUE(desktop().GetMenuBarItemRect(w->GetPlatformWindow(), 2).IsEmpty());
+    // The bar lies between the title bar and the client area.
+    EXPECT_EQ(window.top + window.height, desktop().GetClientRect(w->GetPlatformWindow()).top);
+
+    PointT onWindow(window.left + window.width / 2, window.top + window.height / 2);
+    desktop().MouseMove(onWindow);
+    desktop().MouseDown(onWindow);
+    desktop().MouseUp(onWindow);
+    ASSERT_EQ(w->Messages(message::MenuBarPressed).size(), 1u);
+    for (OS_Event const& e : w->messages) {
+        if (e.message == message::MenuBarPressed) {
+            EXPECT_EQ(e.wParam, 1u);
+        }
+    }
+    EXPECT_TRUE(w->Messages(message::LeftButtonDown).empty()); // the menu took the press
+
+    // The bar beyond the last title is no title.
+    PointT beyond(window.left + window.width + 20, window.top + 5);
+    desktop().MouseDown(beyond);
+    desktop().MouseUp(beyond);
+    EXPECT_EQ(w->Messages(message::MenuBarPressed).size(), 1u);
+
+    // A window made without a menu keeps no titles.
+    auto plain = MakeWindow(RectT(600, 100, 200, 200));
+    desktop().SetMenuBar(plain->GetPlatformWindow(), {u"File"});
+    EXPECT_TRUE(desktop().GetMenuBarItemRect(plain->GetPlatformWindow(), 0).IsEmpty());
+}

@@ -73,8 +73,8 @@ void LookUp(std::vector<std::u16string> const& paths, std::vector<boost::posix_t
     }
 }
 
-// For a helper thread, which must not throw: a stretch it cannot finish (out of memory) keeps
-// not_a_date_time, so its files count as changed and are read again, which loses nothing.
+// Never throws: a stretch that cannot be finished (out of memory) keeps not_a_date_time, so its
+// files count as changed and are read again, which loses nothing.
 void LookUpQuietly(std::vector<std::u16string> const& paths, std::vector<boost::posix_time::ptime>& times,
                    std::size_t first, std::size_t last) noexcept {
     try {
@@ -98,8 +98,12 @@ std::vector<boost::posix_time::ptime> ModifiedTimes(std::vector<std::u16string> 
     std::size_t wanted = std::min({std::size_t(std::max(1u, std::thread::hardware_concurrency())),
                                    MostThreads, std::max<std::size_t>(1, paths.size() / PerThread)});
     std::size_t stretch = (paths.size() + wanted - 1) / std::max<std::size_t>(wanted, 1);
+    // Nothing may throw while a helper runs (a joinable thread that is destroyed ends the process):
+    // the lists are reserved first, and every stretch is looked up quietly.
     std::vector<std::thread> helpers;
     std::vector<std::pair<std::size_t, std::size_t>> leftOver;
+    helpers.reserve(wanted);
+    leftOver.reserve(wanted);
     for (std::size_t first = stretch; first < paths.size(); first += stretch) {
         std::size_t last = std::min(paths.size(), first + stretch);
         try {
@@ -109,9 +113,9 @@ std::vector<boost::posix_time::ptime> ModifiedTimes(std::vector<std::u16string> 
             leftOver.emplace_back(first, last);
         }
     }
-    LookUp(paths, times, 0, std::min(stretch, paths.size()));
+    LookUpQuietly(paths, times, 0, std::min(stretch, paths.size()));
     for (auto const& range : leftOver) {
-        LookUp(paths, times, range.first, range.second);
+        LookUpQuietly(paths, times, range.first, range.second);
     }
     for (std::thread& helper : helpers) {
         helper.join();

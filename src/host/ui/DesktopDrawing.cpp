@@ -72,12 +72,12 @@ void DrawChrome(Canvasor& c, NativeWindowRecord const& record, RectT const& clie
         c.FillRect(RectF(float(BorderWidth), float(BorderWidth + TitleBarHeight),
                          float(r.width - 2 * BorderWidth), float(MenuBarHeight)),
                    GetColor(color::MenuBar));
-        float x = float(BorderWidth);
-        for (std::u16string const& menuTitle : record.menuTitles) {
-            std::string text = orvcore::utility::UTF16to8(menuTitle);
-            c.DrawText(text, PointF(x + 8, float(BorderWidth + TitleBarHeight + 3)), canvasor::Font(),
+        // Where the desktop finds the titles for a press, so the two never disagree.
+        for (std::size_t i = 0; i < record.menuTitles.size(); ++i) {
+            RectT item = Desktop::Get().GetMenuBarItemRect(record.handle, i);
+            c.DrawText(orvcore::utility::UTF16to8(record.menuTitles[i]),
+                       PointF(float(item.left - r.left + 8), float(item.top - r.top + 3)), canvasor::Font(),
                        GetColor(color::TitleText));
-            x += canvasor::Canvasor::Measure(text, canvasor::Font()).width + 16;
         }
     }
     (void)client;
