@@ -206,7 +206,12 @@ void Tour::Run(std::string const& line) {
         need(4, "float TYPE X Y");
         TabPlace from = Find(workspace, w[1]);
         PointT start = OnTab(from);
-        PointT target(std::stoi(w[2]), std::stoi(w[3]));
+        PointT target;
+        try {
+            target = PointT(std::stoi(w[2]), std::stoi(w[3]));
+        } catch (std::logic_error const&) {
+            throw TourError("usage: float TYPE X Y (X and Y whole numbers)");
+        }
         Desktop::Get().MouseMove(start);
         Desktop::Get().MouseDown(start);
         GlideTo(start, target);

@@ -5,7 +5,6 @@
 //   orvdemo [--headless] [--script FILE] [--out FOLDER] [--prefs FOLDER]
 #include "DemoHost.h"
 #include "Tour.h"
-#include "host/core/Error.h"
 #include "host/ui/Desktop.h"
 
 #include <cstdlib>
@@ -14,6 +13,7 @@
 #include <iostream>
 #include <sstream>
 #include <string>
+#include <unistd.h>
 
 #ifndef ORVDEMO_WORKSPACES_DIR
 #define ORVDEMO_WORKSPACES_DIR ""
@@ -72,16 +72,16 @@ int main(int argc, char** argv) {
         text << in.rdbuf();
         tour = text.str();
     }
-    std::filesystem::path outFolder = out.empty() ? FreshFolder("orvdemo") : std::filesystem::path(out);
-    // Unless told otherwise, the demo keeps its workspaces in a fresh preferences folder, so a tour
-    // never touches the user's own.
-    std::filesystem::path prefsFolder = prefs.empty() ? outFolder / "prefs" : std::filesystem::path(prefs);
-    std::filesystem::create_directories(prefsFolder);
-    ::setenv("ORV_PREFS_DIR", prefsFolder.c_str(), 1);
-
-    orvui::ui::Desktop::Reset();
-    orvui::ui::Desktop::Get().SetMonitors({orvdemo::DemoApp::Monitor});
     try {
+        std::filesystem::path outFolder = out.empty() ? FreshFolder("orvdemo") : std::filesystem::path(out);
+        // Unless told otherwise, the demo keeps its workspaces in a fresh preferences folder, so a
+        // tour never touches the user's own.
+        std::filesystem::path prefsFolder =
+            prefs.empty() ? outFolder / "prefs" : std::filesystem::path(prefs);
+        std::filesystem::create_directories(prefsFolder);
+        ::setenv("ORV_PREFS_DIR", prefsFolder.c_str(), 1);
+        orvui::ui::Desktop::Reset();
+        orvui::ui::Desktop::Get().SetMonitors({orvdemo::DemoApp::Monitor});
         std::string shipped = ORVDEMO_WORKSPACES_DIR;
         orvdemo::DemoApp app(std::u16string(shipped.begin(), shipped.end()), u"Editing");
         orvdemo::Tour steps(app, outFolder);
@@ -93,7 +93,8 @@ int main(int argc, char** argv) {
     } catch (orvdemo::TourError const& e) {
         std::cerr << "orvdemo: " << e.what() << "\n";
         return 1;
-    } catch (orvcore::config::Error const& e) {
+    } catch (std::exception const& e) {
+        // The library's errors, and the file system's (an output folder that cannot be made).
         std::cerr << "orvdemo: " << e.what() << "\n";
         return 1;
     }

@@ -132,8 +132,8 @@ TEST_F(DemoTour, ABadLineIsReportedWithItsNumberAndChangesNothing) {
         EXPECT_EQ(std::string(e.what()), "line 3: no panel of type 'nothing' is shown");
     }
     EXPECT_EQ(Shape(), std::make_pair(6ul, std::size_t(1)));
-    for (char const* bad :
-         {"jump", "drag source onto program sideways", "switch Nowhere", "float info", "toggle unicorn"}) {
+    for (char const* bad : {"jump", "drag source onto program sideways", "switch Nowhere", "float info",
+                            "float info here there", "toggle unicorn"}) {
         EXPECT_THROW(tour.Run(bad), orvdemo::TourError) << bad;
     }
     EXPECT_EQ(Shape(), std::make_pair(6ul, std::size_t(1)));
