@@ -9,6 +9,7 @@ packages=(
     libpugixml-dev
     libcairo2-dev fonts-dejavu-core
     libgtest-dev libgmock-dev libbenchmark-dev
+    libsdl2-dev xvfb xauth xdotool
 )
 
 missing=()

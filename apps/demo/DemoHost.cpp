@@ -1,7 +1,9 @@
 #include "DemoHost.h"
 
 #include "DemoPanels.h"
+#include "frames/WorkspaceFrame.h"
 #include "host/ui/Desktop.h"
+#include "host/ui/controls/TabWell.h"
 #include "manager/WorkspaceDialogs.h"
 #include "manager/WorkspaceDirs.h"
 #include "persistence/WorkspaceBuilder.h"
@@ -124,6 +126,25 @@ DemoApp::DemoApp(std::u16string const& systemFolder, std::u16string const& first
 void DemoApp::OnWindowMessage(orvui::ui::OS_Event* event) {
     if (running && event->message == orvui::ui::message::MenuBarPressed && event->wParam == 0) {
         running->OpenWindowMenu();
+    }
+}
+
+void DemoApp::Describe(std::ostream& out) const {
+    for (TopLevelWindow* window : workspace_->GetWindows()) {
+        for (unsigned long f = 0; f < window->GetFrameCount(); ++f) {
+            WorkspaceFrame* frame = window->GetFrame(f);
+            if (!frame || !frame->GetFrontTabPanel()) {
+                continue;
+            }
+            orvui::ui::RectT r = frame->UI_GetGlobalRect();
+            out << "frame " << frame->GetFrontTabPanel()->GetTabType() << ' ' << r.left << ' ' << r.top << ' '
+                << r.width << ' ' << r.height << '\n';
+            for (long i = 0; i < frame->GetTabCount(); ++i) {
+                orvui::ui::RectT tab = frame->GetTabWell()->GetTabGlobalRect(i);
+                out << "tab " << frame->GetTabPanel(i)->GetTabType() << ' ' << tab.left + tab.width / 2 << ' '
+                    << tab.top + tab.height / 2 << '\n';
+            }
+        }
     }
 }
 

@@ -13,6 +13,7 @@
 #include "workspace/Workspace.h"
 
 #include <memory>
+#include <ostream>
 #include <string>
 #include <vector>
 
@@ -80,6 +81,11 @@ public:
     void OpenWindowMenu();
     // Carries out a command of the Window menu; false for one it does not know.
     bool HandleCommand(unsigned long command);
+
+    // Where things are on the desktop, one per line, for scripts that drive the demo from outside:
+    // "tab TYPE X Y" (the centre of each tab) and "frame TYPE LEFT TOP WIDTH HEIGHT" (each frame,
+    // named by its front tab).
+    void Describe(std::ostream& out) const;
 
     DemoWorkspace& GetWorkspace() const { return *workspace_; }
     orvworkspace::workspace::Manager& GetManager() const { return *manager_; }

@@ -1,9 +1,15 @@
-// orvdemo: a mock media editor on orvworkspace. Without a display (or with --headless) it takes a
-// scripted tour through the desktop's input and writes a snapshot after every step, the final
-// workspace document and a Graphviz graph of its layout into an output folder it prints.
+// orvdemo: a mock media editor on orvworkspace. On a display (DISPLAY set, built with SDL2) it is
+// interactive: dock, float, resize, close and reopen panels with the mouse, and the Window menu.
+// Without one, with --headless or with a --script, it takes a scripted tour through the desktop's
+// input and writes a snapshot after every step, the final workspace document and a Graphviz graph
+// of its layout into an output folder it prints. Either way it saves its workspace on the way out
+// (a SIGTERM or SIGINT on a display counts as a request to quit).
 //
-//   orvdemo [--headless] [--script FILE] [--out FOLDER] [--prefs FOLDER]
+//   orvdemo [--headless] [--script FILE] [--out FOLDER] [--prefs FOLDER] [--describe FILE]
 #include "DemoHost.h"
+#ifdef ORV_WITH_SDL
+#include "host/ui_sdl/SdlBackend.h"
+#endif
 #include "Tour.h"
 #include "host/ui/Desktop.h"
 
@@ -22,7 +28,8 @@
 namespace {
 
 int Usage() {
-    std::cerr << "usage: orvdemo [--headless] [--script FILE] [--out FOLDER] [--prefs FOLDER]\n";
+    std::cerr
+        << "usage: orvdemo [--headless] [--script FILE] [--out FOLDER] [--prefs FOLDER] [--describe FILE]\n";
     return 2;
 }
 
@@ -40,7 +47,8 @@ std::filesystem::path FreshFolder(char const* stem) {
 } // namespace
 
 int main(int argc, char** argv) {
-    std::string script, out, prefs;
+    std::string script, out, prefs, describe;
+    bool headless = false;
     for (int i = 1; i < argc; ++i) {
         std::string arg = argv[i];
         auto value = [&](std::string& into) {
@@ -51,13 +59,14 @@ int main(int argc, char** argv) {
             return true;
         };
         if (arg == "--headless") {
-            continue; // the only mode this build has
+            headless = true;
+            continue;
         }
         if ((arg == "--script" && !value(script)) || (arg == "--out" && !value(out)) ||
-            (arg == "--prefs" && !value(prefs))) {
+            (arg == "--prefs" && !value(prefs)) || (arg == "--describe" && !value(describe))) {
             return Usage();
         }
-        if (arg != "--script" && arg != "--out" && arg != "--prefs") {
+        if (arg != "--script" && arg != "--out" && arg != "--prefs" && arg != "--describe") {
             return Usage();
         }
     }
@@ -73,16 +82,39 @@ int main(int argc, char** argv) {
         tour = text.str();
     }
     try {
+        orvui::ui::Desktop::Reset();
+        orvui::ui::Desktop::Get().SetMonitors({orvdemo::DemoApp::Monitor});
+        std::string shipped = ORVDEMO_WORKSPACES_DIR;
+#ifdef ORV_WITH_SDL
+        if (!headless && script.empty() && std::getenv("DISPLAY")) {
+            std::string why;
+            if (auto display = orvui::sdl::SdlBackend::Open(why)) {
+                // On a display the demo is an application like any other: its workspaces live in
+                // the user's preferences folder unless told otherwise, and last from run to run.
+                if (!prefs.empty()) {
+                    std::filesystem::create_directories(prefs);
+                    ::setenv("ORV_PREFS_DIR", prefs.c_str(), 1);
+                }
+                orvdemo::DemoApp app(std::u16string(shipped.begin(), shipped.end()), u"Editing");
+                display->Present();
+                if (!describe.empty()) {
+                    std::ofstream where(describe);
+                    app.Describe(where);
+                }
+                std::cout << "orvdemo: running on the display\n" << std::flush;
+                display->Run();
+                return 0; // the application saves its workspace on the way out
+            }
+            std::cerr << "orvdemo: no display (" << why << "); taking the tour instead\n";
+        }
+#endif
         std::filesystem::path outFolder = out.empty() ? FreshFolder("orvdemo") : std::filesystem::path(out);
-        // Unless told otherwise, the demo keeps its workspaces in a fresh preferences folder, so a
-        // tour never touches the user's own.
+        // Unless told otherwise, a tour keeps its workspaces in a fresh preferences folder, so it
+        // never touches the user's own.
         std::filesystem::path prefsFolder =
             prefs.empty() ? outFolder / "prefs" : std::filesystem::path(prefs);
         std::filesystem::create_directories(prefsFolder);
         ::setenv("ORV_PREFS_DIR", prefsFolder.c_str(), 1);
-        orvui::ui::Desktop::Reset();
-        orvui::ui::Desktop::Get().SetMonitors({orvdemo::DemoApp::Monitor});
-        std::string shipped = ORVDEMO_WORKSPACES_DIR;
         orvdemo::DemoApp app(std::u16string(shipped.begin(), shipped.end()), u"Editing");
         orvdemo::Tour steps(app, outFolder);
         std::istringstream lines(tour);

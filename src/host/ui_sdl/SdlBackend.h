@@ -1,0 +1,49 @@
+// The SDL2 backend of the toolkit: the desktop on a real display. Every shown top-level native
+// window that is not a mouse-transparent overlay becomes one borderless SDL window at its structure
+// rectangle, showing the desktop's composited image of that rectangle, so overlays are blended into
+// the windows beneath them by the toolkit and translucency needs no compositing window manager. SDL
+// input becomes the desktop's global input, the desktop's monitors are SDL's displays, and its
+// clock follows the steady clock. SDL turns SIGINT and SIGTERM into a quit request, so a host that
+// saves on the way out also saves when it is asked to stop.
+#pragma once
+
+#include "host/ui/UITypes.h"
+
+#include <chrono>
+#include <map>
+#include <memory>
+#include <string>
+
+struct SDL_Window;
+union SDL_Event;
+
+namespace orvui::sdl {
+
+class SdlBackend {
+public:
+    // Opens the display; null (with the reason in error) when there is none.
+    static std::unique_ptr<SdlBackend> Open(std::string& error);
+    ~SdlBackend();
+    SdlBackend(SdlBackend const&) = delete;
+    SdlBackend& operator=(SdlBackend const&) = delete;
+
+    // One turn: waits up to waitMs for input, feeds what came to the desktop, advances its clock,
+    // runs its pending work and presents. False once a quit was asked for.
+    bool Turn(int waitMs = 16);
+    bool QuitRequested() const { return quit_; }
+    // Runs turns until a quit is asked for; modal loops meanwhile keep turning too.
+    void Run();
+    // Shows the desktop's windows as they are now.
+    void Present();
+
+private:
+    SdlBackend() = default;
+    void Feed(SDL_Event const& event);
+    ui::PointT Global(unsigned windowId, int x, int y) const;
+
+    std::map<ui::NativeWindow, SDL_Window*> windows_;
+    std::chrono::steady_clock::time_point last_ = std::chrono::steady_clock::now();
+    bool quit_ = false;
+};
+
+} // namespace orvui::sdl
