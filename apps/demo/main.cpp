@@ -12,6 +12,7 @@
 #endif
 #include "Tour.h"
 #include "host/ui/Desktop.h"
+#include "workspace/WorkspaceUtils.h"
 
 #include <cstdlib>
 #include <filesystem>
@@ -96,6 +97,12 @@ int main(int argc, char** argv) {
                     ::setenv("ORV_PREFS_DIR", prefs.c_str(), 1);
                 }
                 orvdemo::DemoApp app(std::u16string(shipped.begin(), shipped.end()), u"Editing");
+                // The ` key maximises the frame under the pointer, or restores the layout.
+                display->SetShortcutHook([&app](char32_t ch) {
+                    return ch == U'`' &&
+                           orvworkspace::workspace::WorkspaceUtils::ToggleFrameMaximizationState(
+                               app.GetWorkspace());
+                });
                 display->Present();
                 if (!describe.empty()) {
                     std::ofstream where(describe);

@@ -1,6 +1,7 @@
 #!/usr/bin/env bash
 # The demo on a real (virtual) X display: a tab dragged with X pointer events onto another frame's
-# right edge makes a new frame there, and a SIGTERM makes the demo save on its way out. Skipped
+# right edge makes a new frame there, the ` key maximises the frame under the pointer, and a SIGTERM
+# makes the demo save on its way out. Skipped
 # (exit 77) where xvfb-run or xdotool is missing. Usage: demo_on_display.sh path/to/orvdemo
 set -euo pipefail
 demo="$1"
@@ -33,6 +34,9 @@ xvfb-run -a -s "-screen 0 1920x1080x24" bash -c '
     done
     sleep 0.3
     xdotool mouseup 1; sleep 0.5
+    read -r _ _ left top width height < <(grep "^frame timeline " "$WORK/where.txt")
+    xdotool mousemove $((left + width / 2)) $((top + height / 2)); sleep 0.2
+    xdotool key grave; sleep 0.5
     kill -TERM "$pid"
     wait "$pid"
 '
@@ -46,3 +50,4 @@ frames="$(grep -o "<key>Frame</key>" "$saved" | wc -l)"
 echo "frames saved: $frames"
 # Editing starts with five frames; the drop makes a sixth, for the info panel alone.
 [ "$frames" -eq 6 ]
+grep -q "<key>MaxFramePath</key>" "$saved" || { echo "no frame was maximised"; exit 1; }

@@ -137,6 +137,9 @@ void SdlBackend::Feed(SDL_Event const& event) {
     case SDL_TEXTINPUT: {
         std::u16string text = orvcore::utility::UTF8to16(event.text.text);
         for (char16_t ch : text) {
+            if (shortcut_ && shortcut_(ch)) {
+                continue;
+            }
             unsigned code = (ch >= u'a' && ch <= u'z') ? unsigned(ch - u'a' + u'A') : unsigned(ch);
             desktop.KeyDown(code, ch);
         }

@@ -10,6 +10,7 @@
 #include "host/ui/UITypes.h"
 
 #include <chrono>
+#include <functional>
 #include <map>
 #include <memory>
 #include <string>
@@ -35,6 +36,9 @@ public:
     void Run();
     // Shows the desktop's windows as they are now.
     void Present();
+    // A host's shortcut keys: called with each typed character before the desktop sees it; true
+    // keeps it from the desktop.
+    void SetShortcutHook(std::function<bool(char32_t)> hook) { shortcut_ = std::move(hook); }
 
 private:
     SdlBackend() = default;
@@ -44,6 +48,7 @@ private:
     std::map<ui::NativeWindow, SDL_Window*> windows_;
     std::chrono::steady_clock::time_point last_ = std::chrono::steady_clock::now();
     bool quit_ = false;
+    std::function<bool(char32_t)> shortcut_;
 };
 
 } // namespace orvui::sdl
