@@ -7,6 +7,7 @@
 #include "manager/WorkspaceDialogs.h"
 #include "manager/WorkspaceDirs.h"
 #include "persistence/WorkspaceBuilder.h"
+#include "workspace/TabPanel.h"
 #include "workspace/TopLevelWindow.h"
 #include "workspace/WorkspaceUtils.h"
 
@@ -113,6 +114,8 @@ DemoApp::DemoApp(std::u16string const& systemFolder, std::u16string const& first
     windowMenu_.AppendItem(u"Delete Workspace...", DeleteWorkspace);
     windowMenu_.AppendItem(u"Reset Workspace...", ResetWorkspace);
     windowMenu_.AppendSeparator();
+    windowMenu_.AppendItem(u"Maximize Frame", MaximizeFrame);
+    windowMenu_.AppendSeparator();
     for (std::size_t i = 0; i < PanelTypes().size(); ++i) {
         windowMenu_.AppendItem(PanelName(PanelTypes()[i]), FirstPanel + i);
     }
@@ -180,6 +183,16 @@ bool DemoApp::HandleCommand(unsigned long command) {
     case ResetWorkspace:
         workspace_->DoWorkspaceCmdReset();
         return true;
+    case MaximizeFrame: {
+        TabPanel* focused = workspace_->GetFocusedTabPanel();
+        auto* frame = focused ? dynamic_cast<WorkspaceFrame*>(focused->GetFrame()) : nullptr;
+        TopLevelWindow* main = workspace_->GetMainTopLevelWindow();
+        if (!frame && main && main->GetFrameCount() > 0) {
+            frame = main->GetFrame(0);
+        }
+        WorkspaceUtils::ToggleThisFrameMaximizationState(*workspace_, frame);
+        return true;
+    }
     default:
         break;
     }

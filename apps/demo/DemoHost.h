@@ -69,12 +69,14 @@ public:
     DemoApp& operator=(DemoApp const&) = delete;
 
     // The main window's Window menu: the workspaces (kept by a menu helper), then new, delete and
-    // reset, then one item per panel kind, checked while it is shown.
+    // reset, maximising the focused panel's frame (the ` key does it for the frame under the
+    // pointer), then one item per panel kind, checked while it is shown.
     enum Command : unsigned long {
         NewWorkspace = 1,
         DeleteWorkspace = 2,
         ResetWorkspace = 3,
-        FirstPanel = 100, // one per panel kind, in the order of PanelTypes
+        MaximizeFrame = 4, // the frame of the focused panel, or back from a maximised one
+        FirstPanel = 100,  // one per panel kind, in the order of PanelTypes
     };
     orvui::utility::OS_Menu& GetWindowMenu();
     // Opens the Window menu under its title in the menu bar and carries out the choice.

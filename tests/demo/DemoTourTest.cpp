@@ -3,12 +3,15 @@
 #include "DemoHost.h"
 #include "Tour.h"
 
+#include "frames/WorkspaceFrame.h"
 #include "host/core/PropList.h"
 #include "host/core/PropListUtils.h"
 #include "host/ui/Desktop.h"
 #include "support/SnapshotOnFailure.h"
 #include "support/TempDir.h"
+#include "workspace/TabPanel.h"
 #include "workspace/TopLevelWindow.h"
+#include "workspace/WorkspaceUtils.h"
 
 #include <cstdlib>
 #include <fstream>
@@ -17,6 +20,8 @@
 
 using orvcore::proplist::PropList;
 using orvtest::TempDir;
+using orvworkspace::workspace::LayoutManager;
+using orvworkspace::workspace::TabPanel;
 
 namespace {
 
@@ -178,4 +183,16 @@ TEST_F(DemoTour, TheWindowMenuListsTheWorkspacesAboveTheHostsItemsWithCheckMarks
     ASSERT_TRUE(app->HandleCommand(orvdemo::DemoApp::FirstPanel + 9)); // History
     EXPECT_TRUE(app->GetWindowMenu().Items().at(texts.size() - 1).checked);
     EXPECT_FALSE(app->HandleCommand(99999));
+
+    // Maximise the focused panel's frame, and back.
+    auto& workspace = app->GetWorkspace();
+    TabPanel* timeline = orvworkspace::workspace::WorkspaceUtils::FindFirstTabOfType(workspace, "timeline");
+    workspace.SetFocusedTabPanel(timeline);
+    LayoutManager* layout = workspace.GetMainTopLevelWindow()->GetLayoutManager();
+    ASSERT_TRUE(app->HandleCommand(orvdemo::DemoApp::MaximizeFrame));
+    ASSERT_NE(layout->GetMaximizedFrame(), nullptr);
+    EXPECT_EQ(layout->GetMaximizedFrame(),
+              dynamic_cast<orvworkspace::workspace::WorkspaceFrame*>(timeline->GetFrame())->GetLMFrame());
+    ASSERT_TRUE(app->HandleCommand(orvdemo::DemoApp::MaximizeFrame));
+    EXPECT_EQ(layout->GetMaximizedFrame(), nullptr);
 }

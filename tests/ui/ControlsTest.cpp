@@ -326,3 +326,28 @@ TEST_F(ControlsTest, PictureButtonsAskForTheirPicturePerState) {
     PointT at = image->UI_LocalToGlobal(PointT(4, 4));
     EXPECT_EQ(Desktop::Get().Snapshot().Pixel(at.x, at.y), ColorRGBAOf(1, 0, 0));
 }
+
+TEST_F(ControlsTest, OnlyABoundedDriverHasItsModalsCutShort) {
+    // A driver that answers only after a long wait, as a person at a display may.
+    auto slow = [](int& turns) {
+        return [&turns](UI_ModalWindow& m) {
+            if (++turns == 12000) {
+                m.EndModal(int(orvui::ui::ButtonOK));
+            }
+        };
+    };
+    int turns = 0;
+    {
+        ScopedModalDriver driver(slow(turns)); // bounded: a script that never answers
+        EXPECT_FALSE(orvui::ui::SimpleConfirmationBox(nullptr, u"Reset", u"Sure?", window.get()));
+    }
+    EXPECT_LT(turns, 12000);
+    turns = 0;
+    {
+        ScopedModalDriver driver(slow(turns), false);
+        EXPECT_FALSE(orvui::ui::IsModalDriverBounded());
+        EXPECT_TRUE(orvui::ui::SimpleConfirmationBox(nullptr, u"Reset", u"Sure?", window.get()));
+    }
+    EXPECT_EQ(turns, 12000);
+    EXPECT_TRUE(orvui::ui::IsModalDriverBounded()); // the scope gave back what it found
+}

@@ -11,16 +11,22 @@ ModalDriver driver;
 // A driver that never ends its modal would hang a headless run; this many turns is plenty for any
 // scripted answer.
 constexpr int MaxTurns = 10000;
+bool driverBounded = true;
 } // namespace
 
-ModalDriver SetModalDriver(ModalDriver next) {
+ModalDriver SetModalDriver(ModalDriver next, bool bounded) {
     ModalDriver previous = std::move(driver);
     driver = std::move(next);
+    driverBounded = bounded;
     return previous;
 }
 
 bool HasModalDriver() {
     return static_cast<bool>(driver);
+}
+
+bool IsModalDriverBounded() {
+    return driverBounded;
 }
 
 void UI_ModalWindow::EndModal(int result) {
@@ -49,7 +55,7 @@ int UI_ModalWindow::RunModal() {
     (initialFocus_ && IsAncestorOf(initialFocus_) ? initialFocus_ : this)
         ->UI_GainKeyboardFocus(FocusByProgram);
     for (int turn = 0; !done_; ++turn) {
-        if (!driver || turn >= MaxTurns) {
+        if (!driver || (driverBounded && turn >= MaxTurns)) {
             CancelModal();
             break;
         }

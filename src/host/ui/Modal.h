@@ -37,20 +37,25 @@ private:
 
 // Called on each turn of a modal loop with the modal window.
 using ModalDriver = std::function<void(UI_ModalWindow& modal)>;
-// Installs the driver for headless runs (empty: none); returns the previous one.
-ModalDriver SetModalDriver(ModalDriver driver);
+// Installs the driver (empty: none); returns the previous one. A bounded driver's modals are
+// cancelled after a fixed number of turns, so a script that never answers cannot hang a headless
+// run; a display backend's driver, which waits on a person, is unbounded.
+ModalDriver SetModalDriver(ModalDriver driver, bool bounded = true);
 bool HasModalDriver();
+bool IsModalDriverBounded();
 
 // Installs a driver for a scope.
 class ScopedModalDriver {
 public:
-    explicit ScopedModalDriver(ModalDriver driver)
-        : previous_(SetModalDriver(std::move(driver))) {}
-    ~ScopedModalDriver() { SetModalDriver(std::move(previous_)); }
+    explicit ScopedModalDriver(ModalDriver driver, bool bounded = true)
+        : previousBounded_(IsModalDriverBounded())
+        , previous_(SetModalDriver(std::move(driver), bounded)) {}
+    ~ScopedModalDriver() { SetModalDriver(std::move(previous_), previousBounded_); }
     ScopedModalDriver(ScopedModalDriver const&) = delete;
     ScopedModalDriver& operator=(ScopedModalDriver const&) = delete;
 
 private:
+    bool previousBounded_;
     ModalDriver previous_;
 };
 

@@ -168,12 +168,14 @@ bool SdlBackend::Turn(int waitMs) {
 
 void SdlBackend::Run() {
     // A modal window (a menu, a dialog) runs its own loop; it keeps the display alive by turning,
-    // and a quit asked for meanwhile cancels it.
-    ui::ScopedModalDriver driver([this](ui::UI_ModalWindow& modal) {
-        if (!Turn()) {
-            modal.CancelModal();
-        }
-    });
+    // for as long as the person takes, and a quit asked for meanwhile cancels it.
+    ui::ScopedModalDriver driver(
+        [this](ui::UI_ModalWindow& modal) {
+            if (!Turn()) {
+                modal.CancelModal();
+            }
+        },
+        false);
     while (Turn()) {
     }
 }
