@@ -152,17 +152,28 @@ void SdlBackend::Feed(SDL_Event const& event) {
 
 bool SdlBackend::Turn(int waitMs) {
     SDL_Event event;
+    bool fed = false;
     if (SDL_WaitEventTimeout(&event, waitMs)) {
         Feed(event);
         while (SDL_PollEvent(&event)) {
             Feed(event);
         }
+        fed = true;
     }
     auto now = std::chrono::steady_clock::now();
-    Desktop::Get().AdvanceTime(std::chrono::duration<double>(now - last_).count());
+    Desktop& desktop = Desktop::Get();
+    desktop.AdvanceTime(std::chrono::duration<double>(now - last_).count());
     last_ = now;
-    Desktop::Get().ProcessPendingWork();
-    Present();
+    desktop.ProcessPendingWork();
+    // An idle display is not composited again: only input, or a window marked for painting (a
+    // timer's work, say), brings a new picture.
+    bool dirty = fed;
+    for (NativeWindow w : desktop.EnumerateWindows()) {
+        dirty = dirty || desktop.IsDirty(w);
+    }
+    if (dirty) {
+        Present();
+    }
     return !quit_;
 }
 
