@@ -120,10 +120,17 @@ void ClearMaximizedFrame(TopLevelWindow& window) {
 }
 
 // A front panel closes; one behind others comes to the front with the focus.
-void CloseOrBringForward(Workspace& workspace, Found const& found, bool focusFirst) {
+// A panel found by its object closes through the workspace's panel form of RemoveTab, one found by
+// type through its index form, so a host overriding either sees the call it expects.
+enum class CloseBy { Index, Panel };
+
+void CloseOrBringForward(Workspace& workspace, Found const& found, bool focusFirst,
+                         CloseBy by = CloseBy::Index) {
     if (found.frame->GetFrontTabIndex() == found.index) {
         if (focusFirst && workspace.GetFocusedTabPanel() != found.panel) {
             workspace.SetFocusedTabPanel(found.panel);
+        } else if (by == CloseBy::Panel) {
+            workspace.RemoveTab(found.frame, found.panel, true, true);
         } else {
             workspace.RemoveTab(found.frame, found.index, true, true);
         }
@@ -339,16 +346,8 @@ void ToggleTabState(Workspace& workspace, boost::intrusive_ptr<TabPanel> tab, bo
         window->GetLayoutManager()->SetMaximizedFrame(nullptr);
         return;
     }
-    if (frame->GetFrontTabPanel() == tab.get()) {
-        if (focusFirst && workspace.GetFocusedTabPanel() != tab.get()) {
-            workspace.SetFocusedTabPanel(tab.get());
-        } else {
-            workspace.RemoveTab(frame, tab.get(), true, true);
-        }
-    } else {
-        frame->BringTabToFront(tab.get());
-        workspace.SetFocusedTabPanel(tab.get());
-    }
+    CloseOrBringForward(workspace, Found{frame, frame->IndexOf(tab.get()), tab.get()}, focusFirst,
+                        CloseBy::Panel);
 }
 
 void ToggleTabState(Workspace& workspace, std::string const& tabType, bool focusFirst) {

@@ -28,13 +28,14 @@ public:
     OpenFolder& operator=(OpenFolder const&) = delete;
     ~OpenFolder() { Close(); }
 
-    // A descriptor for the folder, or -1 when it cannot be opened.
-    int For(std::string const& folder) {
-        if (!opened_ || folder != name_) {
+    // A descriptor for the folder that is path's first length bytes, or -1 when it cannot be
+    // opened; the folder's name is only copied when it changes.
+    int For(std::string const& path, std::size_t length) {
+        if (!opened_ || name_.compare(0, std::string::npos, path, 0, length) != 0) {
             Close();
             opened_ = true;
-            name_ = folder;
-            fd_ = ::open(folder.empty() ? "/" : folder.c_str(), O_PATH | O_DIRECTORY | O_CLOEXEC);
+            name_.assign(path, 0, length);
+            fd_ = ::open(name_.empty() ? "/" : name_.c_str(), O_PATH | O_DIRECTORY | O_CLOEXEC);
         }
         return fd_;
     }
@@ -61,7 +62,7 @@ void LookUp(std::vector<std::u16string> const& paths, std::vector<boost::posix_t
         struct stat info {};
         bool found = false;
         if (slash != std::string::npos && slash + 1 < file.size()) {
-            int fd = folder.For(file.substr(0, slash));
+            int fd = folder.For(file, slash);
             found = fd >= 0 ? ::fstatat(fd, file.c_str() + slash + 1, &info, 0) == 0
                             : ::stat(file.c_str(), &info) == 0;
         } else {

@@ -707,22 +707,25 @@ void Desktop::SetMenuBar(NativeWindow w, std::vector<std::u16string> titles) {
     }
 }
 
-RectT Desktop::GetMenuBarItemRect(NativeWindow w, std::size_t index) const {
+std::vector<RectT> Desktop::GetMenuBarItemRects(NativeWindow w) const {
+    std::vector<RectT> rects;
     NativeWindowRecord const* record = Find(w);
-    if (!record || !record->hasMenu || index >= record->menuTitles.size()) {
-        return RectT();
+    if (!record || !record->hasMenu) {
+        return rects;
     }
     int x = record->rect.left + BorderWidth;
-    for (std::size_t i = 0;; ++i) {
-        int width = int(canvasor::Canvasor::Measure(orvcore::utility::UTF16to8(record->menuTitles[i]),
-                                                    canvasor::Font())
-                            .width) +
-                    16;
-        if (i == index) {
-            return RectT(x, record->rect.top + BorderWidth + TitleBarHeight, width, MenuBarHeight);
-        }
+    for (std::u16string const& title : record->menuTitles) {
+        int width =
+            int(canvasor::Canvasor::Measure(orvcore::utility::UTF16to8(title), canvasor::Font()).width) + 16;
+        rects.emplace_back(x, record->rect.top + BorderWidth + TitleBarHeight, width, MenuBarHeight);
         x += width;
     }
+    return rects;
+}
+
+RectT Desktop::GetMenuBarItemRect(NativeWindow w, std::size_t index) const {
+    std::vector<RectT> rects = GetMenuBarItemRects(w);
+    return index < rects.size() ? rects[index] : RectT();
 }
 
 void Desktop::MouseDown(PointT global, int button, int clickCount) {
@@ -739,9 +742,10 @@ void Desktop::MouseDown(PointT global, int button, int clickCount) {
         if (button == 0 && StartChromeDrag(top, global)) {
             return;
         }
-        if (NativeWindowRecord const* record = Find(top); button == 0 && record && record->hasMenu) {
-            for (std::size_t i = 0; i < record->menuTitles.size(); ++i) {
-                if (GetMenuBarItemRect(top, i).Contains(global)) {
+        if (button == 0) {
+            std::vector<RectT> titles = GetMenuBarItemRects(top);
+            for (std::size_t i = 0; i < titles.size(); ++i) {
+                if (titles[i].Contains(global)) {
                     buttonDown_ = false; // the menu takes the press
                     SendMessage(top, message::MenuBarPressed, i, 0);
                     return;

@@ -200,6 +200,8 @@ public:
     // The titles of a window's menu bar (a window made with a menu); a press on one sends the
     // window MenuBarPressed with its index.
     void SetMenuBar(NativeWindow w, std::vector<std::u16string> titles);
+    // The titles' global rectangles in the bar, left to right.
+    std::vector<RectT> GetMenuBarItemRects(NativeWindow w) const;
     // A title's global rectangle in the bar; empty when there is no such title.
     RectT GetMenuBarItemRect(NativeWindow w, std::size_t index) const;
 

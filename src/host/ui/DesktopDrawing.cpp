@@ -73,8 +73,9 @@ void DrawChrome(Canvasor& c, NativeWindowRecord const& record, RectT const& clie
                          float(r.width - 2 * BorderWidth), float(MenuBarHeight)),
                    GetColor(color::MenuBar));
         // Where the desktop finds the titles for a press, so the two never disagree.
-        for (std::size_t i = 0; i < record.menuTitles.size(); ++i) {
-            RectT item = Desktop::Get().GetMenuBarItemRect(record.handle, i);
+        std::vector<RectT> items = Desktop::Get().GetMenuBarItemRects(record.handle);
+        for (std::size_t i = 0; i < items.size(); ++i) {
+            RectT const& item = items[i];
             c.DrawText(orvcore::utility::UTF16to8(record.menuTitles[i]),
                        PointF(float(item.left - r.left + 8), float(item.top - r.top + 3)), canvasor::Font(),
                        GetColor(color::TitleText));
