@@ -44,8 +44,13 @@ void WorkspaceFrameBase::SetSizeAndPos(FrameZones const& zones) {
     if (UI_GetRect() != target) {
         UI_SetRect(target);
     }
+    FrameZones previous = zones_;
     SetZoneRects(zones);
-    UI_Invalidate();
+    // A layout pass places every frame; only those whose zones moved have borders to redraw (a moved
+    // or resized frame has already marked its old and new areas).
+    if (zones_ != previous) {
+        UI_Invalidate();
+    }
 }
 
 PointT WorkspaceFrameBase::GetMinimumSize() const {
@@ -103,7 +108,12 @@ void WorkspaceFrameBase::UI_Draw(canvasor::Canvasor& c) {
 }
 
 void WorkspaceFrameBase::UI_FocusChanged(int reason) {
-    UI_Invalidate();
+    // Focus shows only in the border's colour, so only the four edge strips are painted again.
+    for (int k = 0; k < 4; ++k) {
+        RectT z = zones_[k];
+        RectF edge(float(z.left), float(z.top), float(z.width), float(z.height));
+        UI_Invalidate(&edge);
+    }
     OS_WorkspaceFrame::UI_FocusChanged(reason);
 }
 

@@ -115,7 +115,11 @@ boost::intrusive_ptr<TablessWorkspaceFrame> TopLevelWindow::CreateTablessFrame(R
 }
 
 boost::intrusive_ptr<WorkspaceFrame> TopLevelWindow::CreateWorkspaceFrame() {
-    return CreateWorkspaceFrame(layoutManager_->GetContainingRect());
+    // Every caller places the frame next (as the root, beside a frame, or by a restore), so it starts
+    // without area. Started over the whole window, it would mark the whole window for repainting
+    // each time one frame is added.
+    RectT containing = layoutManager_->GetContainingRect();
+    return CreateWorkspaceFrame(RectT(containing.left, containing.top, 0, 0));
 }
 
 boost::intrusive_ptr<WorkspaceFrame>

@@ -27,6 +27,23 @@ namespace {
                                          << expected.g << ", " << expected.b << ", " << expected.a << ")";
 }
 
+// How many pixels of an image painted in parts differ from the window painted whole.
+int PixelsDifferingFromWholeRepaint(orvui::ui::NativeWindow w, Image const& partial) {
+    orvui::ui::Desktop::Get().Invalidate(w);
+    Image whole = orvui::ui::Desktop::Get().WindowImage(w);
+    if (whole.Width() != partial.Width() || whole.Height() != partial.Height()) {
+        return -1;
+    }
+    int differing = 0;
+    for (int y = 0; y < whole.Height(); ++y) {
+        for (int x = 0; x < whole.Width(); ++x) {
+            ColorRGBA a = whole.Pixel(x, y), b = partial.Pixel(x, y);
+            differing += a.r != b.r || a.g != b.g || a.b != b.b || a.a != b.a;
+        }
+    }
+    return differing;
+}
+
 // A node that fills itself with one colour.
 class Swatch : public UI_Node {
 public:
@@ -147,7 +164,7 @@ TEST_F(DesktopTest, ANodesChangeRepaintsOnlyItsAreaAndMatchesAWholeRepaint) {
     EXPECT_TRUE(desktop().IsDirty(w));
     RectT client = window->UI_GetGlobalClientRect();
     int cx = client.left - 100, cy = client.top - 100;
-    RectT marked = desktop().Record(w)->dirtyArea;
+    RectT marked = desktop().Record(w)->dirtyRegion.Bounds();
     EXPECT_FALSE(marked.IsEmpty());
     EXPECT_TRUE(marked.Intersection(RectT(cx, cy, 140, 200)).IsEmpty()); // the left node is left alone
     window->UI_UpdateNow();
@@ -157,15 +174,59 @@ TEST_F(DesktopTest, ANodesChangeRepaintsOnlyItsAreaAndMatchesAWholeRepaint) {
     EXPECT_TRUE(Near(partial.Pixel(cx + 200, cy + 100), ColorRGBA(1, 1, 0, 1)));
 
     // Painted whole, the window looks the same pixel for pixel.
-    desktop().Invalidate(w);
-    Image whole = desktop().WindowImage(w);
-    ASSERT_EQ(whole.Width(), partial.Width());
-    int differing = 0;
-    for (int y = 0; y < whole.Height(); ++y) {
-        for (int x = 0; x < whole.Width(); ++x) {
-            ColorRGBA a = whole.Pixel(x, y), b = partial.Pixel(x, y);
-            differing += a.r != b.r || a.g != b.g || a.b != b.b || a.a != b.a;
-        }
-    }
-    EXPECT_EQ(differing, 0);
+    EXPECT_EQ(PixelsDifferingFromWholeRepaint(w, partial), 0);
+}
+
+TEST_F(DesktopTest, AddingReorderingAndRemovingChildrenRepaintsOnlyWhereTheyLie) {
+    auto window = MakeWindow(RectT(100, 100, 400, 300));
+    boost::intrusive_ptr<Swatch> base(new Swatch(ColorRGBA(1, 0, 0, 1)));
+    window->ChildPushBack(base);
+    base->UI_SetRect(RectF(0, 0, 100, 100));
+    NativeWindow w = window->GetPlatformWindow();
+    desktop().WindowImage(w);
+    RectT client = window->UI_GetGlobalClientRect();
+    int cx = client.left - 100, cy = client.top - 100;
+
+    // A child placed before it is attached: only its area is marked, not the window.
+    boost::intrusive_ptr<Swatch> added(new Swatch(ColorRGBA(0, 0, 1, 1)));
+    added->UI_SetRect(RectF(50, 50, 100, 100));
+    window->ChildPushBack(added);
+    EXPECT_FALSE(desktop().IsWhollyDirty(w));
+    RectT marked = desktop().Record(w)->dirtyRegion.Bounds();
+    EXPECT_TRUE(marked.Contains(PointT(cx + 60, cy + 60)));
+    EXPECT_FALSE(marked.Contains(PointT(cx + 300, cy + 200)));
+    Image image = desktop().WindowImage(w);
+    EXPECT_TRUE(Near(image.Pixel(cx + 75, cy + 75), ColorRGBA(0, 0, 1, 1)));
+    EXPECT_EQ(PixelsDifferingFromWholeRepaint(w, image), 0);
+
+    // Brought to the back, the overlap shows the other child again.
+    window->ChildMove(added.get(), 0);
+    EXPECT_FALSE(desktop().IsWhollyDirty(w));
+    image = desktop().WindowImage(w);
+    EXPECT_TRUE(Near(image.Pixel(cx + 75, cy + 75), ColorRGBA(1, 0, 0, 1)));
+    EXPECT_EQ(PixelsDifferingFromWholeRepaint(w, image), 0);
+
+    // Removed, one way or the other, what they covered is background again.
+    window->ChildRemove(base.get());
+    EXPECT_FALSE(desktop().IsWhollyDirty(w));
+    image = desktop().WindowImage(w);
+    EXPECT_TRUE(Near(image.Pixel(cx + 20, cy + 20), GetColor(color::WindowBackground)));
+    EXPECT_TRUE(Near(image.Pixel(cx + 75, cy + 75), ColorRGBA(0, 0, 1, 1)));
+    EXPECT_EQ(window->ChildRemoveIf([&](UI_Node* n) { return n == added.get(); }), 1u);
+    EXPECT_FALSE(desktop().IsWhollyDirty(w));
+    image = desktop().WindowImage(w);
+    EXPECT_TRUE(Near(image.Pixel(cx + 120, cy + 120), GetColor(color::WindowBackground)));
+    EXPECT_EQ(PixelsDifferingFromWholeRepaint(w, image), 0);
+}
+
+TEST_F(DesktopTest, OnlyARealChangeOfActivationOrVisibilityRepaintsAWindowWhole) {
+    auto window = MakeWindow(RectT(100, 100, 400, 300));
+    NativeWindow w = window->GetPlatformWindow();
+    bool active = desktop().IsCaptionActive(w);
+    desktop().WindowImage(w);
+    desktop().SetCaptionActive(w, active);
+    desktop().ShowWindow(w, desktop().IsVisible(w));
+    EXPECT_FALSE(desktop().IsDirty(w));
+    desktop().SetCaptionActive(w, !active);
+    EXPECT_TRUE(desktop().IsWhollyDirty(w));
 }

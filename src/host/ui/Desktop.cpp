@@ -267,7 +267,7 @@ void Desktop::SetWindowRect(NativeWindow w, RectT const& rect) {
 }
 
 void Desktop::ShowWindow(NativeWindow w, bool show) {
-    if (NativeWindowRecord* record = Find(w)) {
+    if (NativeWindowRecord* record = Find(w); record && record->shown != show) {
         record->shown = show;
         record->dirty = true;
     }
@@ -321,13 +321,13 @@ void Desktop::InvalidateArea(NativeWindow w, RectT const& global) {
     RectT area = RectT(global.left - r.left, global.top - r.top, global.width, global.height)
                      .Intersection(RectT(0, 0, r.width, r.height));
     if (!area.IsEmpty()) {
-        record->dirtyArea = record->dirtyArea.Union(area);
+        record->dirtyRegion.Add(area);
     }
 }
 
 bool Desktop::IsDirty(NativeWindow w) const {
     NativeWindowRecord const* record = Find(TopLevelOf(w));
-    return record && (record->dirty || !record->dirtyArea.IsEmpty());
+    return record && (record->dirty || !record->dirtyRegion.IsEmpty());
 }
 
 bool Desktop::IsWhollyDirty(NativeWindow w) const {
@@ -338,7 +338,7 @@ bool Desktop::IsWhollyDirty(NativeWindow w) const {
 void Desktop::ClearDirty(NativeWindow w) {
     if (NativeWindowRecord* record = Find(TopLevelOf(w))) {
         record->dirty = false;
-        record->dirtyArea = RectT();
+        record->dirtyRegion.Clear();
     }
 }
 
@@ -478,7 +478,9 @@ bool Desktop::IsCaptionActive(NativeWindow w) const {
 }
 
 void Desktop::SetCaptionActive(NativeWindow w, bool active) {
-    if (NativeWindowRecord* record = Find(w)) {
+    // Only a change repaints: a window activated again while it is already active (as each newly
+    // focused panel does) must not cost a whole repaint.
+    if (NativeWindowRecord* record = Find(w); record && record->captionActive != active) {
         record->captionActive = active;
         record->dirty = true;
     }

@@ -20,10 +20,12 @@
 // - Timers and delayed calls run in due-time order (install order among equals) as time advances.
 #pragma once
 
+#include "host/ui/DirtyRegion.h"
 #include "host/ui/Events.h"
 #include "host/ui/canvasor/Image.h"
 
 #include <atomic>
+#include <cstdint>
 #include <functional>
 #include <list>
 #include <map>
@@ -68,9 +70,9 @@ struct NativeWindowRecord {
     // The titles of the menu bar, left to right (windows made with a menu).
     std::vector<std::u16string> menuTitles;
     bool captionActive = false;
-    // The whole window needs painting; otherwise dirtyArea (window coordinates) is what does.
+    // The whole window needs painting; otherwise dirtyRegion (window coordinates) is what does.
     bool dirty = true;
-    RectT dirtyArea;
+    DirtyRegion dirtyRegion;
     ShowState showState = ShowState::Normal;
     // Placement flags: 2 restores a minimised window to maximised.
     unsigned placementFlags = 0;
@@ -157,6 +159,9 @@ public:
     // Paints what is marked of a top-level window: only the marked area when no more is marked
     // (the window's nodes that meet it, over the background), else the whole window.
     void PaintDirty(NativeWindow w);
+    // How many pixels the desktop has painted into window images since it was made: the cost of
+    // repainting, for benchmarks and for tests that an edit repaints only what it changed.
+    std::uint64_t PaintedPixels() const { return paintedPixels_; }
     // The window's image, painted first when it is marked.
     canvasor::Image WindowImage(NativeWindow w);
     // The shown windows composited bottom to top, with their opacity, over the area of all the
@@ -271,6 +276,7 @@ private:
     bool RunNextDue(double until, unsigned long newestCall);
 
     std::vector<RectT> monitors_;
+    std::uint64_t paintedPixels_ = 0;
     std::unordered_map<NativeWindow, NativeWindowRecord> records_;
     std::vector<NativeWindow> zOrder_; // top-level windows, bottom to top
     static inline NativeWindow nextHandle_ = 0x100;

@@ -93,6 +93,7 @@ void Desktop::PaintWindow(NativeWindow w) {
         return;
     }
     RectT r = record->rect;
+    paintedPixels_ += std::uint64_t(std::max(0, r.width)) * std::uint64_t(std::max(0, r.height));
     canvasor::Image image(r.width, r.height);
     {
         Canvasor c(image);
@@ -117,7 +118,7 @@ void Desktop::PaintWindow(NativeWindow w) {
     if (record) {
         record->image = image;
         record->dirty = false;
-        record->dirtyArea = RectT();
+        record->dirtyRegion.Clear();
     }
 }
 
@@ -136,14 +137,19 @@ void Desktop::PaintDirty(NativeWindow w) {
     bool whole = record->dirty || record->image.IsEmpty() || record->image.Width() != r.width ||
                  record->image.Height() != r.height || (record->exStyle & style::Layered) || !record->object;
     if (whole) {
-        if (record->dirty || !record->dirtyArea.IsEmpty() || record->image.IsEmpty()) {
+        if (record->dirty || !record->dirtyRegion.IsEmpty() || record->image.IsEmpty()) {
             PaintWindow(top);
         }
         return;
     }
-    RectT area = record->dirtyArea.Intersection(clientArea);
-    record->dirtyArea = RectT();
-    if (area.IsEmpty()) {
+    std::vector<RectT> areas;
+    for (RectT const& marked : record->dirtyRegion.Rects()) {
+        if (RectT area = marked.Intersection(clientArea); !area.IsEmpty()) {
+            areas.push_back(area);
+        }
+    }
+    record->dirtyRegion.Clear();
+    if (areas.empty()) {
         return;
     }
     if (record->image.IsShared()) {
@@ -151,13 +157,18 @@ void Desktop::PaintDirty(NativeWindow w) {
     }
     canvasor::Image image = record->image;
     Canvasor c(image);
-    RectF areaF(float(area.left), float(area.top), float(area.width), float(area.height));
-    c.ClipRect(areaF);
-    c.FillRect(areaF, GetColor(color::WindowBackground));
-    c.Translate(float(clientArea.left), float(clientArea.top));
-    RectF inClient(areaF.left - float(clientArea.left), areaF.top - float(clientArea.top), areaF.width,
-                   areaF.height);
-    DrawNode(record->object, c, true, &inClient);
+    for (RectT const& area : areas) {
+        paintedPixels_ += std::uint64_t(area.width) * std::uint64_t(area.height);
+        c.Save();
+        RectF areaF(float(area.left), float(area.top), float(area.width), float(area.height));
+        c.ClipRect(areaF);
+        c.FillRect(areaF, GetColor(color::WindowBackground));
+        c.Translate(float(clientArea.left), float(clientArea.top));
+        RectF inClient(areaF.left - float(clientArea.left), areaF.top - float(clientArea.top), areaF.width,
+                       areaF.height);
+        DrawNode(record->object, c, true, &inClient);
+        c.Restore();
+    }
 }
 
 canvasor::Image Desktop::WindowImage(NativeWindow w) {

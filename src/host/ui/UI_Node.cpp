@@ -63,7 +63,9 @@ void UI_Node::Attach(UI_Node* child, std::size_t index) {
     child->parent_ = this;
     child->UI_ParentChanged();
     ChildAdded(child);
-    UI_Invalidate();
+    // What changes on screen is what the child covers. Marking the whole parent instead would make
+    // building a window of n frames repaint the window n times.
+    child->UI_Invalidate();
 }
 
 void UI_Node::ChildPushBack(boost::intrusive_ptr<UI_Node> child) {
@@ -85,11 +87,11 @@ bool UI_Node::ChildRemove(UI_Node* child) {
         return false;
     }
     boost::intrusive_ptr<UI_Node> keep = *it;
+    child->UI_Invalidate(); // while it is still placed, so that what it covered is painted again
     children_.erase(it);
     child->parent_ = nullptr;
     child->UI_ParentChanged();
     ChildRemoved(child);
-    UI_Invalidate();
     return true;
 }
 
@@ -103,13 +105,15 @@ std::size_t UI_Node::ChildRemoveIf(std::function<bool(UI_Node*)> const& pick) {
         children_ = std::move(kept);
         return 0;
     }
+    for (auto const& child : removed) {
+        child->UI_Invalidate(); // while it is still placed
+    }
     children_ = std::move(kept);
     for (auto const& child : removed) {
         child->parent_ = nullptr;
         child->UI_ParentChanged();
         ChildRemoved(child.get());
     }
-    UI_Invalidate();
     return removed.size();
 }
 
@@ -122,7 +126,7 @@ void UI_Node::ChildMove(UI_Node* child, std::size_t index) {
     children_.erase(children_.begin() + long(from));
     children_.insert(children_.begin() + long(std::min(index, children_.size())), keep);
     ChildOrderChanged();
-    UI_Invalidate();
+    keep->UI_Invalidate(); // only where it overlaps its siblings can the new order show
 }
 
 std::size_t UI_Node::ChildIndex(UI_Node const* child) const {
@@ -158,6 +162,11 @@ UI_Node* UI_Node::UI_FindNodeByID(std::string const& id) {
 }
 
 void UI_Node::UI_SetRect(RectF const& rect) {
+    // Layout passes set every node's rectangle, most of them unchanged; those must cost no repaint.
+    if (rect.left == rect_.left && rect.top == rect_.top && rect.width == rect_.width &&
+        rect.height == rect_.height) {
+        return;
+    }
     bool resized = rect.width != rect_.width || rect.height != rect_.height;
     UI_Invalidate();
     rect_ = rect;
@@ -258,15 +267,36 @@ void UI_Node::UI_Invalidate(RectF const* area, unsigned) {
     if (!window || Desktop::Get().IsWhollyDirty(window->GetPlatformWindow())) {
         return;
     }
-    RectF local = area ? *area : UI_GetLocalBounds();
-    // Rounded outwards, with a pixel to spare for strokes that straddle the edges.
-    PointT topLeft = UI_LocalToGlobal(
-        PointT(std::int32_t(std::floor(local.left)) - 1, std::int32_t(std::floor(local.top)) - 1));
-    PointT bottomRight = UI_LocalToGlobal(PointT(std::int32_t(std::ceil(local.left + local.width)) + 1,
-                                                 std::int32_t(std::ceil(local.top + local.height)) + 1));
-    Desktop::Get().InvalidateArea(
-        window->GetPlatformWindow(),
-        RectT(topLeft.x, topLeft.y, bottomRight.x - topLeft.x, bottomRight.y - topLeft.y));
+    // Drawing is clipped to every node's bounds on the way down, and nothing under a hidden node is
+    // drawn, so only the part of the area that survives every ancestor can change on screen. Marking
+    // more would stretch the marked area (often to a parent's corner before it is placed) and repaint
+    // what did not change.
+    RectF r = area ? *area : UI_GetLocalBounds();
+    for (UI_Node const* n = this;; n = n->parent_) {
+        // Only a tree under a top-level window is drawn; a node outside one (a panel made but not yet
+        // placed) shows nothing.
+        if (!n || (n != this && !n->shown_)) {
+            return;
+        }
+        r = r.Intersection(n->UI_GetLocalBounds());
+        if (r.IsEmpty()) {
+            return;
+        }
+        if (OS_Window const* w = const_cast<UI_Node*>(n)->UI_GetOSWindow(); w && w->IsTopLevel()) {
+            RectT client = w->UI_GetGlobalClientRect();
+            r.left += float(client.left);
+            r.top += float(client.top);
+            break;
+        }
+        Matrix m = n->UI_GetSelfToParentMatrix();
+        PointF a = m.Apply(PointF(r.left, r.top)), b = m.Apply(PointF(r.left + r.width, r.top + r.height));
+        r = RectF(std::min(a.x, b.x), std::min(a.y, b.y), std::fabs(b.x - a.x), std::fabs(b.y - a.y));
+    }
+    // Rounded outwards, with a pixel to spare for antialiased edges.
+    std::int32_t left = std::int32_t(std::floor(r.left)) - 1, top = std::int32_t(std::floor(r.top)) - 1;
+    std::int32_t right = std::int32_t(std::ceil(r.left + r.width)) + 1;
+    std::int32_t bottom = std::int32_t(std::ceil(r.top + r.height)) + 1;
+    Desktop::Get().InvalidateArea(window->GetPlatformWindow(), RectT(left, top, right - left, bottom - top));
 }
 
 void UI_Node::UI_UpdateNow(unsigned) {
