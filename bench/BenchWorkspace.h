@@ -33,12 +33,13 @@ public:
     static constexpr RectT Large{0, 0, 3840, 2160};
     static constexpr RectT Smaller{0, 0, 3600, 2000};
 
-    BenchWorkspace(int n, std::vector<std::string> const& tabTypes) {
+    // The window covers the one monitor, Large unless given.
+    BenchWorkspace(int n, std::vector<std::string> const& tabTypes, RectT window = Large) {
         orvui::ui::Desktop::Reset();
-        orvui::ui::Desktop::Get().SetMonitors({Large});
+        orvui::ui::Desktop::Get().SetMonitors({window});
         namespace style = orvui::ui::style;
         app = orvui::ui::Desktop::Get().CreateNativeWindow(
-            u"Bench", style::Popup | style::Caption | style::SizingFrame | style::Visible, 0, 0, Large);
+            u"Bench", style::Popup | style::Caption | style::SizingFrame | style::Visible, 0, 0, window);
         workspace = new Workspace;
         for (std::string const& type : tabTypes) {
             workspace->RegisterTabCreator(new PlainPanelCreator(type));

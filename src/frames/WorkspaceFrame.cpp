@@ -38,7 +38,10 @@ WorkspaceFrame::WorkspaceFrame(TopLevelWindow* window, RectT const& rect)
     boost::intrusive_ptr<UI_TabWell> well(new UI_TabWell(
         [this](int action, long index, RectT const* r) { HandleTabItemAction(action, index, r); }));
     ChildPushBack(well);
-    ChildPushBack(new TabPanelContainer);
+    boost::intrusive_ptr<TabPanelContainer> container(new TabPanelContainer);
+    ChildPushBack(container);
+    well_ = well;
+    container_ = container;
     SetSizeAndPos(window->GetLayoutManager()->ConstructFrameZones(rect));
     ChildGet(0)->UI_Show(true);
     ChildGet(1)->UI_Show(true);
@@ -61,6 +64,9 @@ WorkspaceFrame::~WorkspaceFrame() {
 }
 
 UI_TabWell* WorkspaceFrame::GetTabWell() const {
+    if (well_ && ChildSize() > 0 && ChildGet(0) == well_.get()) {
+        return well_.get();
+    }
     auto* well = dynamic_cast<UI_TabWell*>(ChildGet(0));
     if (!well) {
         orvcore::config::ThrowError(orvcore::config::errors::InvalidTypeConversion);
@@ -69,6 +75,9 @@ UI_TabWell* WorkspaceFrame::GetTabWell() const {
 }
 
 TabPanelContainer* WorkspaceFrame::GetContainer() const {
+    if (container_ && ChildSize() > 1 && ChildGet(1) == container_.get()) {
+        return container_.get();
+    }
     auto* container = dynamic_cast<TabPanelContainer*>(ChildGet(1));
     if (!container) {
         orvcore::config::ThrowError(orvcore::config::errors::InvalidTypeConversion);

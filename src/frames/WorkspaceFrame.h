@@ -152,6 +152,11 @@ private:
     void FocusFrontPanel();
 
     RectT cachedTabPanelRect_{-1, -1, -1, -1};
+    // The tab well and panel container made with the frame, so that asking for them (as layout and
+    // every tab query do) needs no type check while they are still children 0 and 1. Held, so that
+    // no other node can take their addresses.
+    boost::intrusive_ptr<orvui::controls::UI_TabWell> well_;
+    boost::intrusive_ptr<TabPanelContainer> container_;
     TabDataList removedTabData_;
     std::list<boost::intrusive_ptr<TabPanel>> hiddenTabs_;
 };

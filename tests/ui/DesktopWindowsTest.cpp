@@ -227,7 +227,10 @@ TEST_F(DesktopTest, DestroyedOrResetWindowsLeaveNoDanglingHandles) {
     EXPECT_EQ(w->GetPlatformWindow(), 0u);
     EXPECT_FALSE(w->IsTopLevel());
     auto survivor = MakeWindow(RectT(0, 0, 100, 100));
-    Desktop::Reset(); // a new desktop while the object still lives
+    Desktop::Reset();                             // a new desktop while the object still lives
+    EXPECT_EQ(survivor->GetPlatformWindow(), 0u); // told its window went with the old desktop
+    EXPECT_FALSE(survivor->IsTopLevel());
+    survivor->UI_Invalidate(); // asks nothing of the old desktop's records
     auto fresh = MakeWindow(RectT(0, 0, 200, 200));
     EXPECT_NE(fresh->GetPlatformWindow(), handle); // handles are never reused
     survivor.reset();                              // must not take the new desktop's window with it

@@ -8,6 +8,7 @@
 #include "host/ui/canvasor/Canvasor.h"
 #include "host/ui/canvasor/SupplierInterface.h"
 
+#include <algorithm>
 #include <cmath>
 
 using namespace orvtest;
@@ -79,6 +80,57 @@ TEST(Canvas, FillsGradientsAndText) {
     EXPECT_TRUE(Near(image.Pixel(16, 16), ColorRGBA(1, 0, 0, 1)));
     EXPECT_TRUE(Near(image.Pixel(75, 20), ColorRGBA(0, 0, 0.5f, 1), 0.03f));
     EXPECT_EQ(image.Pixel(-1, 0), ColorRGBA());
+}
+
+TEST(Canvas, RememberedMeasurementsKeepFontsAndTextsApart) {
+    // Measured twice, with other measurements between, a text keeps its width in each font.
+    canvasor::Font regular, large, bold;
+    large.size = 22.0f;
+    bold.bold = true;
+    float plain = Canvasor::Measure("Plain", regular).width;
+    float bigger = Canvasor::Measure("Plain", large).width;
+    float heavier = Canvasor::Measure("Plain wide", bold).width;
+    EXPECT_GT(bigger, 1.8f * plain);
+    EXPECT_GT(Canvasor::Measure("Plain wide", regular).width, plain);
+    EXPECT_NE(Canvasor::Measure("Plain wide", regular).width, heavier);
+    EXPECT_EQ(Canvasor::Measure("Plain", regular).width, plain);
+    EXPECT_EQ(Canvasor::Measure("Plain", large).width, bigger);
+    Image image(1, 1);
+    Canvasor c(image);
+    EXPECT_EQ(c.MeasureText("Plain wide", bold).width, heavier);
+}
+
+TEST(DirtyRegion, KeepsDistantAreasApartAndMergesWhatCostsNothing) {
+    orvui::ui::DirtyRegion region;
+    auto has = [&](RectT r) {
+        return std::find(region.Rects().begin(), region.Rects().end(), r) != region.Rects().end();
+    };
+    region.Add(RectT());
+    EXPECT_TRUE(region.IsEmpty());
+    // Two corners of a large window stay two small areas.
+    region.Add(RectT(0, 0, 10, 10));
+    region.Add(RectT(990, 990, 10, 10));
+    ASSERT_EQ(region.Rects().size(), 2u);
+    EXPECT_EQ(region.Bounds(), RectT(0, 0, 1000, 1000));
+    // An area inside one adds nothing; one that continues it along an edge joins it.
+    region.Add(RectT(2, 2, 5, 5));
+    region.Add(RectT(10, 0, 10, 10));
+    ASSERT_EQ(region.Rects().size(), 2u);
+    EXPECT_TRUE(has(RectT(0, 0, 20, 10)));
+    // An area covering one swallows it.
+    region.Add(RectT(980, 980, 20, 20));
+    ASSERT_EQ(region.Rects().size(), 2u);
+    EXPECT_TRUE(has(RectT(980, 980, 20, 20)));
+    // Past the limit, the two that waste least together are merged: here the close pair.
+    for (int i = 0; i < int(orvui::ui::DirtyRegion::MaxRects); ++i) {
+        region.Add(RectT(100 * i + 100, 500, 10, 10));
+    }
+    EXPECT_EQ(region.Rects().size(), orvui::ui::DirtyRegion::MaxRects);
+    EXPECT_EQ(region.Bounds(), RectT(0, 0, 1000, 1000));
+    EXPECT_TRUE(has(RectT(0, 0, 20, 10)));
+    EXPECT_TRUE(has(RectT(980, 980, 20, 20)));
+    region.Clear();
+    EXPECT_TRUE(region.IsEmpty());
 }
 
 TEST(Canvas, ImagesRoundTripAsPngAndResourcesDecode) {

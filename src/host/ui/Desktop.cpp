@@ -7,6 +7,7 @@
 #include "host/ui/canvasor/Canvasor.h"
 
 #include <algorithm>
+#include <cmath>
 
 namespace orvui::ui {
 
@@ -25,6 +26,15 @@ void Desktop::Reset() {
 
 Desktop::Desktop()
     : monitors_{RectT(0, 0, 1920, 1080)} {}
+
+Desktop::~Desktop() {
+    // Nodes that outlive their desktop (a reset between tests) must not keep its windows.
+    for (auto& entry : records_) {
+        if (entry.second.object) {
+            entry.second.object->NativeDestroyed();
+        }
+    }
+}
 
 void Desktop::SetMonitors(std::vector<RectT> monitors) {
     if (!monitors.empty()) {
@@ -237,18 +247,32 @@ RectT Desktop::GetWindowRect(NativeWindow w) const {
     return record->rect.Offset(parentClient.left, parentClient.top);
 }
 
+namespace {
+
+// Where a window's client area starts within the window, and how much the chrome takes.
+struct Chrome {
+    int left = 0, top = 0, right = 0, bottom = 0;
+};
+
+Chrome ChromeOf(NativeWindowRecord const& record) {
+    if ((record.style & style::Child) || (record.style & style::Caption) != style::Caption) {
+        return Chrome();
+    }
+    return Chrome{BorderWidth, BorderWidth + TitleBarHeight + (record.hasMenu ? MenuBarHeight : 0),
+                  BorderWidth, BorderWidth};
+}
+
+} // namespace
+
 RectT Desktop::GetClientRect(NativeWindow w) const {
     NativeWindowRecord const* record = Find(w);
     if (!record) {
         return RectT();
     }
     RectT r = GetWindowRect(w);
-    if ((record->style & style::Child) || (record->style & style::Caption) != style::Caption) {
-        return r;
-    }
-    int top = BorderWidth + TitleBarHeight + (record->hasMenu ? MenuBarHeight : 0);
-    return RectT(r.left + BorderWidth, r.top + top, std::max(0, r.width - 2 * BorderWidth),
-                 std::max(0, r.height - top - BorderWidth));
+    Chrome chrome = ChromeOf(*record);
+    return RectT(r.left + chrome.left, r.top + chrome.top, std::max(0, r.width - chrome.left - chrome.right),
+                 std::max(0, r.height - chrome.top - chrome.bottom));
 }
 
 void Desktop::SetWindowRect(NativeWindow w, RectT const& rect) {
@@ -320,6 +344,27 @@ void Desktop::InvalidateArea(NativeWindow w, RectT const& global) {
     RectT r = record->rect;
     RectT area = RectT(global.left - r.left, global.top - r.top, global.width, global.height)
                      .Intersection(RectT(0, 0, r.width, r.height));
+    if (!area.IsEmpty()) {
+        record->dirtyRegion.Add(area);
+    }
+}
+
+void Desktop::InvalidateClientArea(NativeWindow w, RectF const& local) {
+    NativeWindowRecord* record = Find(w);
+    if (record && record->parent) {
+        record = Find(TopLevelOf(w));
+    }
+    if (!record || record->dirty) {
+        return;
+    }
+    Chrome chrome = ChromeOf(*record);
+    // Rounded outwards, with a pixel to spare for antialiased edges.
+    std::int32_t left = std::int32_t(std::floor(local.left)) - 1 + chrome.left;
+    std::int32_t top = std::int32_t(std::floor(local.top)) - 1 + chrome.top;
+    std::int32_t right = std::int32_t(std::ceil(local.left + local.width)) + 1 + chrome.left;
+    std::int32_t bottom = std::int32_t(std::ceil(local.top + local.height)) + 1 + chrome.top;
+    RectT area = RectT(left, top, right - left, bottom - top)
+                     .Intersection(RectT(0, 0, record->rect.width, record->rect.height));
     if (!area.IsEmpty()) {
         record->dirtyRegion.Add(area);
     }

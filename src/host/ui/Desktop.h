@@ -96,6 +96,8 @@ public:
     static Desktop& Get();
     // Starts over with a fresh desktop (one monitor of 1920 × 1080, time 0, no windows); for tests.
     static void Reset();
+    // Tells the nodes still holding windows that the windows are gone.
+    ~Desktop();
 
     // --- Monitors ---
     void SetMonitors(std::vector<RectT> monitors);
@@ -149,6 +151,8 @@ public:
     void Invalidate(NativeWindow w);
     // Marks part of a window (global coordinates) for painting; the marks of a window add up.
     void InvalidateArea(NativeWindow w, RectT const& global);
+    // Marks an area given relative to the client area of w's top-level window (rounded outwards).
+    void InvalidateClientArea(NativeWindow w, RectF const& local);
     bool IsDirty(NativeWindow w) const;
     // Whether the whole of the window's top-level window is already marked, so that marking a part
     // of it adds nothing.

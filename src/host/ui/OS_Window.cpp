@@ -19,6 +19,7 @@ NativeWindow OS_Window::UI_CreateWindow(std::u16string const& title, NativeWindo
         desktop.DestroyNativeWindow(window_);
     }
     window_ = desktop.CreateNativeWindow(title, style, exStyle, owner, rect, this, hasMenu);
+    record_ = desktop.Record(window_);
     UI_Node::UI_Show((style & style::Visible) != 0);
     if (IsTopLevel()) {
         NativeRectChanged();
@@ -37,6 +38,7 @@ void OS_Window::UI_AttachWindow(NativeWindow window) {
         UI_DetachOSWindow();
     }
     window_ = window;
+    record_ = desktop.Record(window);
     desktop.SetObject(window, this);
     UI_Node::UI_Show(desktop.IsVisible(window));
     NativeRectChanged();
@@ -48,6 +50,7 @@ NativeWindow OS_Window::UI_DetachOSWindow() {
         Desktop::Get().SetObject(window, nullptr);
     }
     window_ = 0;
+    record_ = nullptr;
     return window;
 }
 
@@ -86,8 +89,7 @@ void OS_Window::UI_HandleOSEvent(OS_Event& event) {
 }
 
 bool OS_Window::IsTopLevel() const {
-    Desktop& desktop = Desktop::Get();
-    return window_ && desktop.IsWindow(window_) && !(desktop.GetStyle(window_) & style::Child);
+    return record_ && !(record_->style & style::Child);
 }
 
 void OS_Window::UI_ParentChanged() {

@@ -10,6 +10,8 @@
 
 namespace orvui::ui {
 
+struct NativeWindowRecord;
+
 class OS_Window : public UI_Container {
 public:
     static constexpr char PropertyName[] = "orvui::ui::OS_Window::property";
@@ -64,13 +66,19 @@ public:
     // The desktop moved or resized the native window: the node follows.
     void NativeRectChanged();
     // The native window is gone (destroyed, or its desktop reset): the node forgets it.
-    void NativeDestroyed() { window_ = 0; }
+    void NativeDestroyed() {
+        window_ = 0;
+        record_ = nullptr;
+    }
     // A child window's node moved: its native window follows it under the new parent window.
     void UI_ParentChanged() override;
 
 private:
     EventFunction eventFunction_ = nullptr;
     NativeWindow window_ = 0;
+    // The desktop's record of window_, kept while window_ lives (the desktop says when it goes), so
+    // that the questions every walk up the node tree asks need no look-up.
+    NativeWindowRecord const* record_ = nullptr;
 };
 
 // A window with the toolkit's own drawing, for content such as pop-up menus.

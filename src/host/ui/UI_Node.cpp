@@ -256,21 +256,10 @@ void UI_Node::UI_Invalidate(RectF const* area, unsigned) {
         Desktop::Get().Invalidate(self->GetPlatformWindow());
         return;
     }
-    OS_Window* window = nullptr;
-    for (UI_Node* n = this; n && !window; n = n->parent_) {
-        if (OS_Window* w = n->UI_GetOSWindow(); w && w->GetPlatformWindow()) {
-            window = w;
-        }
-    }
-    // Once the whole window is marked (as while a workspace is being rebuilt), there is nothing to
-    // add, and the node's global position need not be worked out.
-    if (!window || Desktop::Get().IsWhollyDirty(window->GetPlatformWindow())) {
-        return;
-    }
     // Drawing is clipped to every node's bounds on the way down, and nothing under a hidden node is
     // drawn, so only the part of the area that survives every ancestor can change on screen. Marking
     // more would stretch the marked area (often to a parent's corner before it is placed) and repaint
-    // what did not change.
+    // what did not change. One walk up finds both that part and the top-level window.
     RectF r = area ? *area : UI_GetLocalBounds();
     for (UI_Node const* n = this;; n = n->parent_) {
         // Only a tree under a top-level window is drawn; a node outside one (a panel made but not yet
@@ -283,20 +272,13 @@ void UI_Node::UI_Invalidate(RectF const* area, unsigned) {
             return;
         }
         if (OS_Window const* w = const_cast<UI_Node*>(n)->UI_GetOSWindow(); w && w->IsTopLevel()) {
-            RectT client = w->UI_GetGlobalClientRect();
-            r.left += float(client.left);
-            r.top += float(client.top);
-            break;
+            Desktop::Get().InvalidateClientArea(w->GetPlatformWindow(), r);
+            return;
         }
         Matrix m = n->UI_GetSelfToParentMatrix();
         PointF a = m.Apply(PointF(r.left, r.top)), b = m.Apply(PointF(r.left + r.width, r.top + r.height));
         r = RectF(std::min(a.x, b.x), std::min(a.y, b.y), std::fabs(b.x - a.x), std::fabs(b.y - a.y));
     }
-    // Rounded outwards, with a pixel to spare for antialiased edges.
-    std::int32_t left = std::int32_t(std::floor(r.left)) - 1, top = std::int32_t(std::floor(r.top)) - 1;
-    std::int32_t right = std::int32_t(std::ceil(r.left + r.width)) + 1;
-    std::int32_t bottom = std::int32_t(std::ceil(r.top + r.height)) + 1;
-    Desktop::Get().InvalidateArea(window->GetPlatformWindow(), RectT(left, top, right - left, bottom - top));
 }
 
 void UI_Node::UI_UpdateNow(unsigned) {

@@ -2,6 +2,7 @@
 #include "host/ui/canvasor/Canvasor.h"
 
 #include <cairo.h>
+#include <unordered_map>
 
 namespace canvasor {
 
@@ -102,9 +103,29 @@ TextMetrics Canvasor::MeasureText(std::string const& utf8, Font const& font) {
 }
 
 TextMetrics Canvasor::Measure(std::string const& utf8, Font const& font) {
+    // Layout measures the same few labels (panel names) over and over, each time a frame is made;
+    // a measurement costs a context and a font selection, so results are kept. The cache is
+    // emptied when full rather than grown without bound by, say, names with counters in them.
+    static std::unordered_map<std::string, TextMetrics> measured;
+    constexpr std::size_t MaxMeasured = 4096;
+    static std::string key; // reused, so that a look-up allocates nothing (UI thread only)
+    key.clear();
+    key += font.family;
+    key += '\0';
+    key.append(reinterpret_cast<char const*>(&font.size), sizeof font.size); // exact, and no formatting
+    key += font.bold ? 'b' : 'r';
+    key += utf8;
+    if (auto found = measured.find(key); found != measured.end()) {
+        return found->second;
+    }
     static Image scratch(1, 1);
     Canvasor c(scratch);
-    return c.MeasureText(utf8, font);
+    TextMetrics metrics = c.MeasureText(utf8, font);
+    if (measured.size() >= MaxMeasured) {
+        measured.clear();
+    }
+    measured.emplace(key, metrics);
+    return metrics;
 }
 
 void Canvasor::DrawImage(Image const& image, RectF const& r, float opacity) {
