@@ -121,6 +121,8 @@ bool TabPanel::UI_DoMouseActivate() {
 }
 
 void TabPanel::UI_FocusChanged(int reason) {
+    // A panel may show its focus in what it draws; its frame repaints only its own borders.
+    UI_Invalidate();
     if (UI_HasKeyboardFocus(false)) {
         Touch();
         if (workspace_) {

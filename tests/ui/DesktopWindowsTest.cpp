@@ -237,6 +237,33 @@ TEST_F(DesktopTest, DestroyedOrResetWindowsLeaveNoDanglingHandles) {
     EXPECT_TRUE(desktop().IsWindow(fresh->GetPlatformWindow()));
 }
 
+TEST_F(DesktopTest, AWindowTakenOverByAnotherObjectIsForgottenByTheFirst) {
+    auto first = MakeWindow(RectT(0, 0, 400, 300));
+    NativeWindow handle = first->GetPlatformWindow();
+    boost::intrusive_ptr<RecordingWindow> second(new RecordingWindow);
+    second->UI_AttachWindow(handle);
+    EXPECT_EQ(second->GetPlatformWindow(), handle);
+    EXPECT_EQ(first->GetPlatformWindow(), 0u);
+    EXPECT_FALSE(first->IsTopLevel());
+    first.reset(); // must not destroy the window it no longer has
+    EXPECT_TRUE(desktop().IsWindow(handle));
+    second.reset();
+    EXPECT_FALSE(desktop().IsWindow(handle));
+}
+
+TEST_F(DesktopTest, RaisingOrDestroyingAWindowCountsAsAStackingChange) {
+    auto back = MakeWindow(RectT(0, 0, 400, 300));
+    auto front = MakeWindow(RectT(100, 100, 400, 300));
+    std::uint64_t before = desktop().StackingChanges();
+    desktop().BringToFront(front->GetPlatformWindow()); // already in front
+    EXPECT_EQ(desktop().StackingChanges(), before);
+    desktop().BringToFront(back->GetPlatformWindow());
+    EXPECT_GT(desktop().StackingChanges(), before);
+    before = desktop().StackingChanges();
+    back.reset();
+    EXPECT_GT(desktop().StackingChanges(), before);
+}
+
 TEST_F(DesktopTest, ApplicationReturningReactivatesItsWindow) {
     auto a = MakeWindow(RectT(0, 0, 400, 300));
     a->UI_Activate();

@@ -110,6 +110,7 @@ void Desktop::DestroyNativeWindow(NativeWindow w) {
     UnlinkChild(*record);
     if (!(record->style & style::Child)) {
         zOrder_.erase(std::remove(zOrder_.begin(), zOrder_.end(), w), zOrder_.end());
+        ++stackingChanges_; // what was beneath it shows now
     }
     // Windows it owned lose their owner, as the platform would leave them. Child windows own none,
     // and skipping the walk for them keeps tearing down a frame tree linear.
@@ -142,6 +143,11 @@ void Desktop::DestroyNativeWindow(NativeWindow w) {
 
 void Desktop::SetObject(NativeWindow w, OS_Window* object) {
     if (NativeWindowRecord* record = Find(w)) {
+        // A window has one object: the one it leaves must forget it, or it would go on using (and
+        // at its end destroy) a window that is no longer its own.
+        if (OS_Window* previous = record->object; previous && previous != object) {
+            previous->NativeDestroyed();
+        }
         record->object = object;
         record->properties[OS_Window::PropertyName] = object;
     }
@@ -406,6 +412,7 @@ void Desktop::LiftOwned(NativeWindow owner) {
         }
     }
     for (NativeWindow w : owned) {
+        ++stackingChanges_;
         zOrder_.erase(std::remove(zOrder_.begin(), zOrder_.end(), w), zOrder_.end());
         zOrder_.push_back(w);
         LiftOwned(w);
@@ -416,6 +423,9 @@ void Desktop::BringToFront(NativeWindow w) {
     w = TopLevelOf(w);
     if (!w) {
         return;
+    }
+    if (zOrder_.empty() || zOrder_.back() != w) {
+        ++stackingChanges_;
     }
     zOrder_.erase(std::remove(zOrder_.begin(), zOrder_.end(), w), zOrder_.end());
     zOrder_.push_back(w);

@@ -166,6 +166,10 @@ public:
     // How many pixels the desktop has painted into window images since it was made: the cost of
     // repainting, for benchmarks and for tests that an edit repaints only what it changed.
     std::uint64_t PaintedPixels() const { return paintedPixels_; }
+    // Counts changes to which top-level windows cover which (one raised, lowered or destroyed),
+    // which mark no window for painting and yet change the screen: a display compares it between
+    // pictures.
+    std::uint64_t StackingChanges() const { return stackingChanges_; }
     // The window's image, painted first when it is marked.
     canvasor::Image WindowImage(NativeWindow w);
     // The shown windows composited bottom to top, with their opacity, over the area of all the
@@ -281,6 +285,7 @@ private:
 
     std::vector<RectT> monitors_;
     std::uint64_t paintedPixels_ = 0;
+    std::uint64_t stackingChanges_ = 0;
     std::unordered_map<NativeWindow, NativeWindowRecord> records_;
     std::vector<NativeWindow> zOrder_; // top-level windows, bottom to top
     static inline NativeWindow nextHandle_ = 0x100;

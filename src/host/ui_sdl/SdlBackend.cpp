@@ -165,9 +165,9 @@ bool SdlBackend::Turn(int waitMs) {
     desktop.AdvanceTime(std::chrono::duration<double>(now - last_).count());
     last_ = now;
     desktop.ProcessPendingWork();
-    // An idle display is not composited again: only input, or a window marked for painting (a
-    // timer's work, say), brings a new picture.
-    bool dirty = fed;
+    // An idle display is not composited again: only input, a window marked for painting (a
+    // timer's work, say) or a change in which window covers which brings a new picture.
+    bool dirty = fed || desktop.StackingChanges() != presentedStacking_;
     for (NativeWindow w : desktop.EnumerateWindows()) {
         dirty = dirty || desktop.IsDirty(w);
     }
@@ -193,6 +193,7 @@ void SdlBackend::Run() {
 
 void SdlBackend::Present() {
     Desktop& desktop = Desktop::Get();
+    presentedStacking_ = desktop.StackingChanges();
     canvasor::Image screen = desktop.Snapshot();
     cairo_surface_t* surface = screen.Surface();
     cairo_surface_flush(surface);

@@ -10,6 +10,7 @@
 #include "host/ui/UITypes.h"
 
 #include <chrono>
+#include <cstdint>
 #include <functional>
 #include <map>
 #include <memory>
@@ -47,6 +48,8 @@ private:
 
     std::map<ui::NativeWindow, SDL_Window*> windows_;
     std::chrono::steady_clock::time_point last_ = std::chrono::steady_clock::now();
+    // The desktop's stacking count at the last picture; a change means the picture is out of date.
+    std::uint64_t presentedStacking_ = ~std::uint64_t(0);
     bool quit_ = false;
     std::function<bool(char32_t)> shortcut_;
 };
