@@ -504,9 +504,18 @@ ReusableTabPool CollectReusableTabs(Workspace& workspace) {
         }
     }
     workspace.FindAllHiddenTabs(pool);
-    // A panel kept by a closed-window record may also sit in a frame's list; each is pooled once.
-    std::set<TabPanel*> seen;
-    pool.remove_if([&](auto const& panel) { return !seen.insert(panel.get()).second; });
+    // A panel kept by a closed-window record may also sit in a frame's list; each is pooled once, at
+    // its first place. Duplicates are rare, so they are found by sorting a copy of the pointers.
+    std::vector<TabPanel*> sorted;
+    sorted.reserve(pool.size());
+    for (auto const& panel : pool) {
+        sorted.push_back(panel.get());
+    }
+    std::sort(sorted.begin(), sorted.end());
+    if (std::adjacent_find(sorted.begin(), sorted.end()) != sorted.end()) {
+        std::set<TabPanel*> seen;
+        pool.remove_if([&](auto const& panel) { return !seen.insert(panel.get()).second; });
+    }
     return pool;
 }
 

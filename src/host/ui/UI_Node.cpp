@@ -59,6 +59,9 @@ void UI_Node::Attach(UI_Node* child, std::size_t index) {
         child->parent_->ChildRemove(child);
     }
     index = std::min(index, children_.size());
+    if (children_.capacity() == 0) {
+        children_.reserve(4); // most parents have a few children: one allocation, not one per doubling
+    }
     children_.insert(children_.begin() + long(index), keep);
     child->parent_ = this;
     child->UI_ParentChanged();
