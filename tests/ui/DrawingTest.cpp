@@ -271,6 +271,24 @@ TEST_F(DesktopTest, AddingReorderingAndRemovingChildrenRepaintsOnlyWhereTheyLie)
     EXPECT_EQ(PixelsDifferingFromWholeRepaint(w, image), 0);
 }
 
+TEST_F(DesktopTest, AChangeUnderAMenuBarIsRepaintedWhereItShows) {
+    boost::intrusive_ptr<RecordingWindow> window(new RecordingWindow);
+    window->UI_CreateWindow(u"menu", 0, RectT(50, 50, 400, 300),
+                            style::Popup | style::Caption | style::SizingFrame | style::Visible, 0, true);
+    boost::intrusive_ptr<Swatch> swatch(new Swatch(ColorRGBA(1, 0, 0, 1)));
+    window->ChildPushBack(swatch);
+    swatch->UI_SetRect(RectF(10, 10, 40, 40));
+    NativeWindow w = window->GetPlatformWindow();
+    desktop().WindowImage(w);
+    swatch->color = ColorRGBA(0, 0, 1, 1);
+    swatch->UI_Invalidate();
+    EXPECT_FALSE(desktop().IsWhollyDirty(w));
+    Image image = desktop().WindowImage(w);
+    RectT client = window->UI_GetGlobalClientRect();
+    EXPECT_TRUE(Near(image.Pixel(client.left - 50 + 30, client.top - 50 + 30), ColorRGBA(0, 0, 1, 1)));
+    EXPECT_EQ(PixelsDifferingFromWholeRepaint(w, image), 0);
+}
+
 TEST_F(DesktopTest, OnlyARealChangeOfActivationOrVisibilityRepaintsAWindowWhole) {
     auto window = MakeWindow(RectT(100, 100, 400, 300));
     NativeWindow w = window->GetPlatformWindow();
