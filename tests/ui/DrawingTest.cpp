@@ -1,6 +1,7 @@
 // Drawing: the canvas, images and resources, and snapshots of windows with their chrome, background
 // and opacity.
 #include "UiDoubles.h"
+#include "support/ImageCompare.h"
 
 #include "host/ui/NodeManager.h"
 #include "host/ui/ResourceManager.h"
@@ -31,18 +32,7 @@ namespace {
 // How many pixels of an image painted in parts differ from the window painted whole.
 int PixelsDifferingFromWholeRepaint(orvui::ui::NativeWindow w, Image const& partial) {
     orvui::ui::Desktop::Get().Invalidate(w);
-    Image whole = orvui::ui::Desktop::Get().WindowImage(w);
-    if (whole.Width() != partial.Width() || whole.Height() != partial.Height()) {
-        return -1;
-    }
-    int differing = 0;
-    for (int y = 0; y < whole.Height(); ++y) {
-        for (int x = 0; x < whole.Width(); ++x) {
-            ColorRGBA a = whole.Pixel(x, y), b = partial.Pixel(x, y);
-            differing += a.r != b.r || a.g != b.g || a.b != b.b || a.a != b.a;
-        }
-    }
-    return differing;
+    return orvtest::PixelsDiffering(orvui::ui::Desktop::Get().WindowImage(w), partial);
 }
 
 // A node that fills itself with one colour.

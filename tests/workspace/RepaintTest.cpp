@@ -2,6 +2,7 @@
 // only where something changed looks exactly like the window painted whole, and an edit in one
 // corner of a window with many frames repaints that corner, not the window.
 #include "WorkspaceDoubles.h"
+#include "support/ImageCompare.h"
 
 #include "workspace/WorkspaceUtils.h"
 
@@ -19,18 +20,7 @@ protected:
     int StaleAfterPartialPaints() {
         canvasor::Image partial = Desktop::Get().WindowImage(Window()).Clone();
         Desktop::Get().Invalidate(Window());
-        canvasor::Image whole = Desktop::Get().WindowImage(Window());
-        if (whole.Width() != partial.Width() || whole.Height() != partial.Height()) {
-            return -1;
-        }
-        int stale = 0;
-        for (int y = 0; y < whole.Height(); ++y) {
-            for (int x = 0; x < whole.Width(); ++x) {
-                canvasor::ColorRGBA a = whole.Pixel(x, y), b = partial.Pixel(x, y);
-                stale += a.r != b.r || a.g != b.g || a.b != b.b || a.a != b.a;
-            }
-        }
-        return stale;
+        return PixelsDiffering(Desktop::Get().WindowImage(Window()), partial);
     }
     // What an edit costs in painted pixels, as a share of the whole window.
     template <class Edit> double ShareRepainted(Edit&& edit) {
