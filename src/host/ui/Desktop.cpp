@@ -342,19 +342,6 @@ void Desktop::Invalidate(NativeWindow w) {
     }
 }
 
-void Desktop::InvalidateArea(NativeWindow w, RectT const& global) {
-    NativeWindowRecord* record = Find(TopLevelOf(w));
-    if (!record || record->dirty) {
-        return;
-    }
-    RectT r = record->rect;
-    RectT area = RectT(global.left - r.left, global.top - r.top, global.width, global.height)
-                     .Intersection(RectT(0, 0, r.width, r.height));
-    if (!area.IsEmpty()) {
-        record->dirtyRegion.Add(area);
-    }
-}
-
 void Desktop::InvalidateClientArea(NativeWindow w, RectF const& local) {
     NativeWindowRecord* record = Find(w);
     if (record && record->parent) {

@@ -149,9 +149,8 @@ public:
     bool IsEnabled(NativeWindow w) const;
     // Marks a window's whole top-level window for painting.
     void Invalidate(NativeWindow w);
-    // Marks part of a window (global coordinates) for painting; the marks of a window add up.
-    void InvalidateArea(NativeWindow w, RectT const& global);
-    // Marks an area given relative to the client area of w's top-level window (rounded outwards).
+    // Marks part of w's top-level window for painting, given relative to its client area (rounded
+    // outwards); the marks of a window add up.
     void InvalidateClientArea(NativeWindow w, RectF const& local);
     bool IsDirty(NativeWindow w) const;
     // Whether the whole of the window's top-level window is already marked, so that marking a part

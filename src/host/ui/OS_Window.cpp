@@ -88,6 +88,10 @@ void OS_Window::UI_HandleOSEvent(OS_Event& event) {
     }
 }
 
+bool OS_Window::IsMarkedWhole() const {
+    return record_ && record_->dirty;
+}
+
 bool OS_Window::IsTopLevel() const {
     return record_ && !(record_->style & style::Child);
 }

@@ -45,6 +45,9 @@ public:
     virtual void UI_HandleOSEvent(OS_Event& event);
 
     bool IsTopLevel() const;
+    // Whether the whole of this (top-level) window is already marked for painting, so that marking
+    // a part adds nothing; asked without a look-up.
+    bool IsMarkedWhole() const;
     RectT UI_GetGlobalStructureRect() const;
     void UI_SetGlobalStructureRect(RectT const& rect);
     RectT UI_GetGlobalClientRect() const;

@@ -275,7 +275,9 @@ void UI_Node::UI_Invalidate(RectF const* area, unsigned) {
             return;
         }
         if (OS_Window const* w = const_cast<UI_Node*>(n)->UI_GetOSWindow(); w && w->IsTopLevel()) {
-            Desktop::Get().InvalidateClientArea(w->GetPlatformWindow(), r);
+            if (!w->IsMarkedWhole()) { // as while a workspace is rebuilt: nothing to add
+                Desktop::Get().InvalidateClientArea(w->GetPlatformWindow(), r);
+            }
             return;
         }
         Matrix m = n->UI_GetSelfToParentMatrix();
