@@ -207,42 +207,42 @@ void UI_TabWell::MoveTab(long from, long to) {
 }
 
 void UI_TabWell::UpdateTabName(long index, std::u16string const& name) {
-    if (UI_TabItem* item = GetTab(index)) {
+    if (UI_TabItem* item = GetTab(index); item && item->name != name) {
         item->name = name;
         Arrange();
     }
 }
 
 void UI_TabWell::UpdateTabColor(long index, ColorRGBA const& color) {
-    if (UI_TabItem* item = GetTab(index)) {
+    if (UI_TabItem* item = GetTab(index); item && !(item->color == color)) {
         item->color = color;
         UI_Invalidate();
     }
 }
 
 void UI_TabWell::SetMultitab(long index, bool multiTab) {
-    if (UI_TabItem* item = GetTab(index)) {
+    if (UI_TabItem* item = GetTab(index); item && item->multiTab != multiTab) {
         item->multiTab = multiTab;
         Arrange();
     }
 }
 
 void UI_TabWell::SetLockable(long index, bool lockable) {
-    if (UI_TabItem* item = GetTab(index)) {
+    if (UI_TabItem* item = GetTab(index); item && item->lockable != lockable) {
         item->lockable = lockable;
         Arrange();
     }
 }
 
 void UI_TabWell::SetLocked(long index, bool locked) {
-    if (UI_TabItem* item = GetTab(index)) {
+    if (UI_TabItem* item = GetTab(index); item && item->locked != locked) {
         item->locked = locked;
         UI_Invalidate();
     }
 }
 
 void UI_TabWell::SetCanClose(long index, bool canClose) {
-    if (UI_TabItem* item = GetTab(index)) {
+    if (UI_TabItem* item = GetTab(index); item && item->canClose != canClose) {
         item->canClose = canClose;
         Arrange();
     }
