@@ -326,13 +326,17 @@ void UI_TabWell::Arrange() {
 }
 
 void UI_TabWell::UI_SizeChanged() {
-    ScrollBy(0); // keeps the scroll position within what the new size allows
+    // The scroll position is kept within what the new size allows, and the items are arranged once.
+    scroll_ = std::clamp(scroll_, 0.0f, MostScroll());
     Arrange();
 }
 
+float UI_TabWell::MostScroll() const {
+    return std::max(0.0f, ItemsLength() - std::max(0.0f, ItemsRoom()));
+}
+
 void UI_TabWell::ScrollBy(float delta) {
-    float most = std::max(0.0f, ItemsLength() - std::max(0.0f, ItemsRoom()));
-    float next = std::clamp(scroll_ + delta, 0.0f, most);
+    float next = std::clamp(scroll_ + delta, 0.0f, MostScroll());
     if (next != scroll_) {
         scroll_ = next;
         Arrange();

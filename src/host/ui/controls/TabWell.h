@@ -166,6 +166,8 @@ private:
     float Length() const { return vertical_ ? UI_GetRect().height : UI_GetRect().width; }
     float ItemsLength() const;
     float ItemsRoom() const;
+    // How far the items can scroll: the length they need beyond the room they have.
+    float MostScroll() const;
     void DrawItem(canvasor::Canvasor& c, long index);
 
     TabActionCallback callback_;
