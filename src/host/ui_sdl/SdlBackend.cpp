@@ -43,7 +43,43 @@ SdlBackend::~SdlBackend() {
     for (auto& entry : windows_) {
         SDL_DestroyWindow(entry.second);
     }
+    for (auto& entry : cursors_) {
+        SDL_FreeCursor(entry.second);
+    }
     SDL_Quit();
+}
+
+void SdlBackend::ShowCursor() {
+    int cursor = Desktop::Get().GetCursor();
+    if (cursor == shownCursor_) {
+        return;
+    }
+    shownCursor_ = cursor;
+    SDL_SystemCursor system = SDL_SYSTEM_CURSOR_ARROW;
+    switch (cursor) {
+    case 10: // a vertical bar, dragged sideways
+        system = SDL_SYSTEM_CURSOR_SIZEWE;
+        break;
+    case 11: // a horizontal bar, dragged up and down
+        system = SDL_SYSTEM_CURSOR_SIZENS;
+        break;
+    case 12: // where bars cross
+    case 20: // a whole frame being dragged
+        system = SDL_SYSTEM_CURSOR_SIZEALL;
+        break;
+    case 19: // one tab being dragged
+        system = SDL_SYSTEM_CURSOR_HAND;
+        break;
+    default:
+        break;
+    }
+    SDL_Cursor*& made = cursors_[int(system)];
+    if (!made) {
+        made = SDL_CreateSystemCursor(system);
+    }
+    if (made) {
+        SDL_SetCursor(made);
+    }
 }
 
 PointT SdlBackend::Global(unsigned windowId, int x, int y) const {
@@ -165,6 +201,7 @@ bool SdlBackend::Turn(int waitMs) {
     desktop.AdvanceTime(std::chrono::duration<double>(now - last_).count());
     last_ = now;
     desktop.ProcessPendingWork();
+    ShowCursor();
     // An idle display is not composited again: only input, a window marked for painting (a
     // timer's work, say) or a change in which window covers which brings a new picture.
     bool dirty = fed || desktop.StackingChanges() != presentedStacking_;

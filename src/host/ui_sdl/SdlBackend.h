@@ -3,8 +3,10 @@
 // rectangle, showing the desktop's composited image of that rectangle, so overlays are blended into
 // the windows beneath them by the toolkit and translucency needs no compositing window manager. SDL
 // input becomes the desktop's global input, the desktop's monitors are SDL's displays, and its
-// clock follows the steady clock. SDL turns SIGINT and SIGTERM into a quit request, so a host that
-// saves on the way out also saves when it is asked to stop.
+// clock follows the steady clock. The toolkit's cursor shows as the nearest system cursor (splitter
+// bars as resize arrows, dragged tabs as a hand, dragged frames as a move cross). SDL turns SIGINT
+// and SIGTERM into a quit request, so a host that saves on the way out also saves when it is asked
+// to stop.
 #pragma once
 
 #include "host/ui/UITypes.h"
@@ -17,6 +19,7 @@
 #include <string>
 
 struct SDL_Window;
+struct SDL_Cursor;
 union SDL_Event;
 
 namespace orvui::sdl {
@@ -45,6 +48,8 @@ private:
     SdlBackend() = default;
     void Feed(SDL_Event const& event);
     ui::PointT Global(unsigned windowId, int x, int y) const;
+    // Shows the desktop's current cursor as the nearest system cursor.
+    void ShowCursor();
 
     std::map<ui::NativeWindow, SDL_Window*> windows_;
     std::chrono::steady_clock::time_point last_ = std::chrono::steady_clock::now();
@@ -52,6 +57,9 @@ private:
     std::uint64_t presentedStacking_ = ~std::uint64_t(0);
     bool quit_ = false;
     std::function<bool(char32_t)> shortcut_;
+    // System cursors by their SDL kind, made on first use; the toolkit's cursor number shown last.
+    std::map<int, SDL_Cursor*> cursors_;
+    int shownCursor_ = -1;
 };
 
 } // namespace orvui::sdl
